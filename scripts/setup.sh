@@ -57,6 +57,7 @@ LAUNCHER=()
 if command -v ccache >/dev/null; then
     LAUNCHER=(-DCMAKE_CXX_COMPILER_LAUNCHER=ccache)
     export CCACHE_DIR="${CCACHE_DIR:-$HOME/.cache/ccache}"
+    export CCACHE_BASEDIR="$ROOT"
     ccache --max-size=5G >/dev/null 2>&1 || true
 fi
 

@@ -13,7 +13,7 @@ int main()
     if (vexa::MathHelper::toDegree(vexa::MathHelper::toRadiant(90.0)) < 89.999)
         return 1;
 #ifdef HAVE_VEXA_DOMAIN
-    if (vexa::Geometry(std::string("45as15")).toString() != "45as15")
+    if (vexa::Geometry(QStringLiteral("45as15")).toString() != QStringLiteral("45as15"))
         return 2;
 #endif
     std::printf("consumer linked against Vexa %s\n",
