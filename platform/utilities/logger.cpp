@@ -3,8 +3,6 @@
 #include <QDebug>
 #include <QMutexLocker>
 
-namespace vexa {
-
 QString logCategoryName(LogCategory category)
 {
     switch (category) {
@@ -75,4 +73,3 @@ void Logger::write(LogLevel level, LogCategory category, const QString &message)
     }
 }
 
-} // namespace vexa

@@ -6,8 +6,8 @@
 #include <QString>
 #include <QVector>
 
-namespace vexa {
-
+// The logging classes are global, like the settings classes: hosts use them
+// without the library namespace.
 enum class LogCategory {
     General,
     Colorimetry,
@@ -55,4 +55,3 @@ private:
     bool m_alwaysQt = false;
 };
 
-} // namespace vexa
