@@ -2,14 +2,15 @@
 #     DIR <folder name used in include paths, e.g. utilities>
 #     SOURCES <.cpp and .h files, relative to the current source dir>
 #     PUBLIC_HEADERS <headers installed for hosts>
-#     PUBLIC_LIBS <...> PRIVATE_LIBS <...>)
+#     PUBLIC_LIBS <...> PRIVATE_LIBS <...>
+#     [OUTPUT_NAME <file base name>] [INCLUDE_BASE <dir>])
 #
 # Creates target vexa_<dir> with the alias Vexa::<Name>, an export header
 # <dir>/<dir>_export.h defining <DIR>_EXPORT, build and install include paths,
 # and installs the target into the VexaTargets export set.
 # Headers are included as <dir/file.h>: a platform library's folder is its include prefix.
 function(vexa_add_library name)
-    cmake_parse_arguments(ARG "" "DIR;INCLUDE_BASE" "SOURCES;PUBLIC_HEADERS;PUBLIC_LIBS;PRIVATE_LIBS" ${ARGN})
+    cmake_parse_arguments(ARG "" "DIR;INCLUDE_BASE;OUTPUT_NAME" "SOURCES;PUBLIC_HEADERS;PUBLIC_LIBS;PRIVATE_LIBS" ${ARGN})
     set(target vexa_${ARG_DIR})
     string(REPLACE "-" "_" target "${target}")
     add_library(${target} ${ARG_SOURCES})
@@ -27,9 +28,12 @@ function(vexa_add_library name)
         "$<BUILD_INTERFACE:${PROJECT_BINARY_DIR}/include>"
         "$<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}/vexa>")
     target_link_libraries(${target} PUBLIC ${ARG_PUBLIC_LIBS} PRIVATE ${ARG_PRIVATE_LIBS})
+    if(NOT ARG_OUTPUT_NAME)
+        set(ARG_OUTPUT_NAME vexa-${ARG_DIR})
+    endif()
     set_target_properties(${target} PROPERTIES
         EXPORT_NAME ${name}
-        OUTPUT_NAME vexa-${ARG_DIR}
+        OUTPUT_NAME ${ARG_OUTPUT_NAME}
         VERSION ${PROJECT_VERSION}
         SOVERSION ${PROJECT_VERSION_MAJOR}
         CXX_VISIBILITY_PRESET hidden
