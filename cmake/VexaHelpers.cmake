@@ -16,9 +16,13 @@ function(vexa_add_library name)
     add_library(${target} ${ARG_SOURCES})
     add_library(Vexa::${name} ALIAS ${target})
     string(TOUPPER "${ARG_DIR}" upper)
+    set(macro VEXA_${upper}_EXPORT)
+    if(upper STREQUAL "VEXA")
+        set(macro VEXA_EXPORT)
+    endif()
     generate_export_header(${target}
         BASE_NAME ${upper}
-        EXPORT_MACRO_NAME VEXA_${upper}_EXPORT
+        EXPORT_MACRO_NAME ${macro}
         EXPORT_FILE_NAME "${PROJECT_BINARY_DIR}/include/${ARG_DIR}/${ARG_DIR}_export.h")
     if(NOT ARG_INCLUDE_BASE)
         get_filename_component(ARG_INCLUDE_BASE "${CMAKE_CURRENT_SOURCE_DIR}" DIRECTORY)
