@@ -1,0 +1,7 @@
+#include "tolerancerule.h"
+
+namespace vexa {
+
+ToleranceRule::~ToleranceRule() = default;
+
+} // namespace vexa
