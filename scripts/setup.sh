@@ -58,6 +58,8 @@ if command -v ccache >/dev/null; then
     LAUNCHER=(-DCMAKE_CXX_COMPILER_LAUNCHER=ccache)
     export CCACHE_DIR="${CCACHE_DIR:-$HOME/.cache/ccache}"
     export CCACHE_BASEDIR="$ROOT"
+    # Debug info names the build folder; ignore it so clones in other folders share hits.
+    export CCACHE_NOHASHDIR=1
     ccache --max-size=5G >/dev/null 2>&1 || true
 fi
 
