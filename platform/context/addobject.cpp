@@ -1,0 +1,13 @@
+#include <context/addobject.h>
+
+namespace vexa {
+
+AddObject::AddObject() = default;
+AddObject::~AddObject() = default;
+
+QString AddObject::typeName() const
+{
+    return typeId();
+}
+
+} // namespace vexa

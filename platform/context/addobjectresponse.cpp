@@ -1,0 +1,7 @@
+#include <context/addobjectresponse.h>
+
+namespace vexa {
+
+AddObjectResponse::~AddObjectResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/copyobjectresponse.h>
+
+namespace vexa {
+
+CopyObjectResponse::~CopyObjectResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/getappearanceimageresponse.h>
+
+namespace vexa {
+
+GetAppearanceImageResponse::~GetAppearanceImageResponse() = default;
+
+} // namespace vexa

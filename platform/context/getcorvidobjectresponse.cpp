@@ -1,0 +1,7 @@
+#include <context/getcorvidobjectresponse.h>
+
+namespace vexa {
+
+GetCorvidObjectResponse::~GetCorvidObjectResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/getcorvidobjectsresponse.h>
+
+namespace vexa {
+
+GetCorvidObjectsResponse::~GetCorvidObjectsResponse() = default;
+
+} // namespace vexa

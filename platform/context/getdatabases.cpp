@@ -1,0 +1,13 @@
+#include <context/getdatabases.h>
+
+namespace vexa {
+
+GetDatabases::GetDatabases() = default;
+GetDatabases::~GetDatabases() = default;
+
+QString GetDatabases::typeName() const
+{
+    return typeId();
+}
+
+} // namespace vexa

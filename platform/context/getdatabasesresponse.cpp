@@ -1,0 +1,7 @@
+#include <context/getdatabasesresponse.h>
+
+namespace vexa {
+
+GetDatabasesResponse::~GetDatabasesResponse() = default;
+
+} // namespace vexa

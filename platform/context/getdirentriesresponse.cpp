@@ -1,0 +1,7 @@
+#include <context/getdirentriesresponse.h>
+
+namespace vexa {
+
+GetDirEntriesResponse::~GetDirEntriesResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/moveobjectresponse.h>
+
+namespace vexa {
+
+MoveObjectResponse::~MoveObjectResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/serverinforesponse.h>
+
+namespace vexa {
+
+ServerInfoResponse::~ServerInfoResponse() = default;
+
+} // namespace vexa

@@ -1,0 +1,7 @@
+#include <context/updateobjectresponse.h>
+
+namespace vexa {
+
+UpdateObjectResponse::~UpdateObjectResponse() = default;
+
+} // namespace vexa

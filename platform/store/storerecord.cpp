@@ -1,0 +1,10 @@
+#include <store/storerecord.h>
+
+namespace vexa {
+
+QString StoreRecord::folderType()
+{
+    return QStringLiteral("Folder");
+}
+
+} // namespace vexa
