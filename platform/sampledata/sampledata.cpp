@@ -123,8 +123,11 @@ double reflectance(const Paint &p, double nm, double aspecular, const Deviation 
     const double s = p.edge / (1.0 + std::exp(-(nm - p.edgeNm - d.hueShiftNm) / 18.0));
     const double colour = p.base + d.chroma * (g + s);
     // Metallic flop: bright near the specular, dark far from it.
-    const double angular = p.flop > 0 ? (1.0 - p.flop) + p.flop * 2.6 * std::exp(-std::abs(aspecular) / 28.0)
-                                      : 1.0 - 0.0006 * std::abs(aspecular);
+    // Towards the illumination (negative aspecular angles) the flakes reflect less than
+    // at the same angle past the specular.
+    const double away = aspecular < 0 ? 1.8 * -aspecular : aspecular;
+    const double angular = p.flop > 0 ? (1.0 - p.flop) + p.flop * 2.6 * std::exp(-away / 28.0)
+                                      : 1.0 - 0.0006 * away;
     const double value = colour * angular * d.lightness;
     return std::clamp(value, 0.002, 1.5);
 }
