@@ -40,6 +40,7 @@ function(vexa_add_library name)
         OUTPUT_NAME ${ARG_OUTPUT_NAME}
         VERSION ${PROJECT_VERSION}
         SOVERSION ${PROJECT_VERSION_MAJOR}
+        INSTALL_RPATH "$ORIGIN"
         CXX_VISIBILITY_PRESET hidden
         VISIBILITY_INLINES_HIDDEN ON)
     install(TARGETS ${target} EXPORT VexaTargets

@@ -1,0 +1,193 @@
+#include "mainwindow.h"
+
+#include "comparisonpage.h"
+
+#include <vexa/export/widgetprinter.h>
+#include <vexa/models/jobdetailviewsettings.h>
+#include <vexa/tables/multicolorvaluewidget.h>
+
+#include <domain/direntry.h>
+#include <settings/generalsettings.h>
+#include <settings/settingsmanager.h>
+#include <settings/settingswidget.h>
+#include <utilities/logger.h>
+
+#include <QApplication>
+#include <QComboBox>
+#include <QFileDialog>
+#include <QLabel>
+#include <QMenuBar>
+#include <QMessageBox>
+#include <QProgressBar>
+#include <QStatusBar>
+#include <QToolBar>
+
+namespace vexa {
+
+MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
+                       std::shared_ptr<JobDetailViewSettings> viewSettings, QWidget *parent)
+    : QMainWindow(parent)
+    , m_generalSettings(std::move(generalSettings))
+    , m_viewSettings(std::move(viewSettings))
+    , m_session(new StoreSession(this))
+    , m_page(new ComparisonPage(m_generalSettings, m_viewSettings, this))
+    , m_jobBox(new QComboBox(this))
+    , m_statusLabel(new QLabel(this))
+    , m_progress(new QProgressBar(this))
+{
+    setWindowTitle(tr("Vexa QC — colour comparison"));
+    setCentralWidget(m_page);
+
+    auto *toolbar = addToolBar(tr("Job"));
+    toolbar->setObjectName(QStringLiteral("jobToolbar"));
+    toolbar->setMovable(false);
+    toolbar->addWidget(new QLabel(tr("  QC job: "), this));
+    m_jobBox->setObjectName(QStringLiteral("jobBox"));
+    m_jobBox->setMinimumWidth(260);
+    toolbar->addWidget(m_jobBox);
+
+    m_progress->setMaximumWidth(160);
+    m_progress->setRange(0, 0);
+    m_progress->hide();
+    statusBar()->addWidget(m_statusLabel, 1);
+    statusBar()->addPermanentWidget(m_progress);
+
+    buildMenus();
+
+    connect(m_session, &StoreSession::sgOpened, m_session, &StoreSession::listJobs);
+    connect(m_session, &StoreSession::sgJobsListed, this, &MainWindow::onJobsListed);
+    connect(m_session, &StoreSession::sgJobLoaded, this, &MainWindow::onJobLoaded);
+    connect(m_session, &StoreSession::sgError, this, &MainWindow::showError);
+    connect(m_session, &StoreSession::sgBusy, this, &MainWindow::setBusy);
+    connect(m_jobBox, QOverload<int>::of(&QComboBox::activated), this, &MainWindow::onJobChosen);
+    resize(1400, 900);
+}
+
+MainWindow::~MainWindow() = default;
+
+void MainWindow::buildMenus()
+{
+    QMenu *file = menuBar()->addMenu(tr("&File"));
+    file->addAction(tr("Open store…"), this, &MainWindow::chooseStore);
+    file->addSeparator();
+    file->addAction(tr("Export table to CSV…"), this, &MainWindow::exportCsv);
+    file->addAction(tr("Export table to Excel…"), this, &MainWindow::exportExcel);
+    file->addSeparator();
+    file->addAction(tr("Print table…"), this, &MainWindow::printTable);
+    file->addAction(tr("Print page to PDF…"), this, &MainWindow::printPlotsToPdf);
+    file->addSeparator();
+    file->addAction(tr("Quit"), qApp, &QApplication::quit, QKeySequence::Quit);
+
+    QMenu *view = menuBar()->addMenu(tr("&View"));
+    view->addAction(tr("View settings…"), this, &MainWindow::openSettings);
+}
+
+void MainWindow::openStore(const QString &storePath, const QString &jobName)
+{
+    m_wantedJob = jobName;
+    m_statusLabel->setText(tr("Store: %1").arg(storePath));
+    m_session->open(storePath);
+}
+
+void MainWindow::onJobsListed(const std::vector<std::shared_ptr<DirEntry>> &entries)
+{
+    m_jobs = entries;
+    m_jobBox->clear();
+    int wanted = entries.empty() ? -1 : 0;
+    for (int i = 0; i < int(entries.size()); ++i) {
+        m_jobBox->addItem(entries[i]->header().name());
+        if (!m_wantedJob.isEmpty() && entries[i]->header().name() == m_wantedJob)
+            wanted = i;
+    }
+    if (wanted < 0) {
+        showError(tr("The store holds no QC job."));
+        return;
+    }
+    if (!m_wantedJob.isEmpty() && entries[wanted]->header().name() != m_wantedJob)
+        showError(tr("There is no QC job named \"%1\".").arg(m_wantedJob));
+    m_jobBox->setCurrentIndex(wanted);
+    onJobChosen(wanted);
+}
+
+void MainWindow::onJobChosen(int index)
+{
+    if (index < 0 || index >= int(m_jobs.size()))
+        return;
+    m_session->loadJob(m_jobs[size_t(index)]);
+}
+
+void MainWindow::onJobLoaded(const LoadedJob &job)
+{
+    m_page->showJob(job);
+    m_statusLabel->setText(tr("%1 — %2 objects from %3")
+                               .arg(m_jobBox->currentText())
+                               .arg(job.objects.size())
+                               .arg(m_session->storePath()));
+    Q_EMIT sgJobShown();
+}
+
+void MainWindow::showError(const QString &message)
+{
+    Logger::instance().error(LogCategory::General, QStringLiteral("MainWindow: ") + message);
+    if (m_messageSink)
+        m_messageSink(tr("Vexa QC"), message);
+    else
+        QMessageBox::warning(this, tr("Vexa QC"), message);
+}
+
+void MainWindow::setBusy(const QString &task, bool busy)
+{
+    m_progress->setVisible(busy);
+    if (busy)
+        m_statusLabel->setText(task + QStringLiteral("…"));
+}
+
+// The view settings open in a dialog generated from the settings group; OK writes them
+// back, persists them and every view re-reads them.
+void MainWindow::openSettings()
+{
+    SettingsWidget dialog(m_viewSettings, this);
+    dialog.setWindowTitle(tr("View settings"));
+    if (dialog.exec() != QDialog::Accepted)
+        return;
+    SettingsManager::instance().saveClientSettings();
+    m_page->settingsChanged();
+}
+
+void MainWindow::exportCsv()
+{
+    m_page->tableWidget()->onExportToCSV();
+}
+
+void MainWindow::exportExcel()
+{
+    setBusy(tr("Exporting"), true);
+    m_page->tableWidget()->onExportToExcel();
+    setBusy(tr("Exporting"), false);
+    m_statusLabel->setText(tr("Ready"));
+}
+
+void MainWindow::printTable()
+{
+    m_page->tableWidget()->print();
+}
+
+void MainWindow::printPlotsToPdf()
+{
+    const QString file = QFileDialog::getSaveFileName(this, tr("Print page to PDF"), QString(),
+                                                      tr("PDF files (*.pdf)"));
+    if (file.isEmpty())
+        return;
+    if (!WidgetPrinter::printWidgetToPdf(m_page, file))
+        showError(tr("%1 could not be written.").arg(file));
+}
+
+void MainWindow::chooseStore()
+{
+    const QString file = QFileDialog::getOpenFileName(this, tr("Open object store"), QString(),
+                                                      tr("Object stores (*.vexastore);;All files (*)"));
+    if (!file.isEmpty())
+        openStore(file);
+}
+
+} // namespace vexa

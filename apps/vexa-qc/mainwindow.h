@@ -1,0 +1,70 @@
+#pragma once
+
+#include "storesession.h"
+
+#include <QMainWindow>
+
+#include <functional>
+#include <memory>
+
+class QComboBox;
+class QLabel;
+class QProgressBar;
+class GeneralSettings;
+
+namespace vexa {
+
+class ComparisonPage;
+class JobDetailViewSettings;
+
+// The comparison workstation: a job chooser, one comparison page, menus for the
+// view settings, export and printing, and a status bar that shows long work.
+class MainWindow : public QMainWindow
+{
+    Q_OBJECT
+public:
+    MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
+               std::shared_ptr<JobDetailViewSettings> viewSettings, QWidget *parent = nullptr);
+    ~MainWindow() override;
+
+    // Opens the store and, once it is listed, the job of that name (or the first one).
+    void openStore(const QString &storePath, const QString &jobName = QString());
+    ComparisonPage *page() const { return m_page; }
+    StoreSession *session() const { return m_session; }
+    QComboBox *jobBox() const { return m_jobBox; }
+
+    // Message boxes go through here so that headless runs can log them instead.
+    using MessageSink = std::function<void(const QString &title, const QString &text)>;
+    void setMessageSink(MessageSink sink) { m_messageSink = std::move(sink); }
+
+Q_SIGNALS:
+    // A job is shown and its views are filled.
+    void sgJobShown();
+
+private:
+    void buildMenus();
+    void onJobsListed(const std::vector<std::shared_ptr<DirEntry>> &entries);
+    void onJobChosen(int index);
+    void onJobLoaded(const LoadedJob &job);
+    void showError(const QString &message);
+    void setBusy(const QString &task, bool busy);
+    void openSettings();
+    void exportCsv();
+    void exportExcel();
+    void printTable();
+    void printPlotsToPdf();
+    void chooseStore();
+
+    std::shared_ptr<GeneralSettings> m_generalSettings;
+    std::shared_ptr<JobDetailViewSettings> m_viewSettings;
+    StoreSession *m_session;        // Child.
+    ComparisonPage *m_page;         // Child.
+    QComboBox *m_jobBox;            // Child.
+    QLabel *m_statusLabel;          // Child.
+    QProgressBar *m_progress;       // Child.
+    std::vector<std::shared_ptr<DirEntry>> m_jobs;
+    QString m_wantedJob;
+    MessageSink m_messageSink;
+};
+
+} // namespace vexa

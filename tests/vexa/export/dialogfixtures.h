@@ -1,0 +1,83 @@
+#pragma once
+
+// Stand-ins for the user at the library's modal dialogs (installed through DialogRunner),
+// and the independent workbook reader of the export tests.
+
+#include <vexa/export/dialogrunner.h>
+
+#include <QDialog>
+#include <QFileDialog>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QProcess>
+#include <QStringList>
+
+#include <functional>
+
+// Runs save dialogs by choosing the given file (or cancelling when it is empty) and
+// records what the dialog showed.
+struct ChooseFile
+{
+    explicit ChooseFile(QString file)
+    {
+        vexa::DialogRunner::setFunction([file, this](QDialog &dialog) {
+            auto *fileDialog = qobject_cast<QFileDialog *>(&dialog);
+            if (!fileDialog)
+                return int(QDialog::Rejected);
+            shownFolder = fileDialog->directory().absolutePath();
+            shownFilter = fileDialog->nameFilters().join(";;");
+            ++shown;
+            if (file.isEmpty())
+                return int(QDialog::Rejected);
+            fileDialog->selectFile(file);
+            return int(QDialog::Accepted);
+        });
+    }
+    ~ChooseFile() { vexa::DialogRunner::setFunction(nullptr); }
+    ChooseFile(const ChooseFile &) = delete;
+    ChooseFile &operator=(const ChooseFile &) = delete;
+
+    QString shownFolder;
+    QString shownFilter;
+    int shown = 0;
+};
+
+// Runs every dialog through a function for the duration of a scope.
+struct RunDialogs
+{
+    explicit RunDialogs(std::function<int(QDialog &)> function)
+    {
+        vexa::DialogRunner::setFunction(std::move(function));
+    }
+    ~RunDialogs() { vexa::DialogRunner::setFunction(nullptr); }
+    RunDialogs(const RunDialogs &) = delete;
+    RunDialogs &operator=(const RunDialogs &) = delete;
+};
+
+// Debian's Python with python3-openpyxl (not whichever python3 comes first on PATH).
+inline QString workbookReaderPython()
+{
+    return QStringLiteral("/usr/bin/python3");
+}
+
+inline bool workbookReaderAvailable()
+{
+    QProcess probe;
+    probe.start(workbookReaderPython(), {QStringLiteral("-c"), QStringLiteral("import openpyxl")});
+    return probe.waitForFinished(30000) && probe.exitStatus() == QProcess::NormalExit && probe.exitCode() == 0;
+}
+
+// The workbook as openpyxl reads it (see read_xlsx.py); an empty object when it cannot be read,
+// with the reason in *error.
+inline QJsonObject readWorkbook(const QString &path, QString *error = nullptr)
+{
+    QProcess process;
+    process.start(workbookReaderPython(),
+                  {QStringLiteral(VEXA_SOURCE_DIR "/tests/vexa/export/read_xlsx.py"), path});
+    if (!process.waitForFinished(60000) || process.exitCode() != 0) {
+        if (error)
+            *error = QString::fromUtf8(process.readAllStandardError());
+        return QJsonObject();
+    }
+    return QJsonDocument::fromJson(process.readAllStandardOutput()).object();
+}
