@@ -1,5 +1,7 @@
 #include "appearanceviewdatamodel.h"
 
+#include "sameobjects_p.h"
+
 #include <colorimetry/colorconverter.h>
 #include <domain/appearancevalues.h>
 #include <domain/labvalue.h>
@@ -14,19 +16,6 @@
 
 namespace vexa {
 
-namespace {
-template<typename T>
-bool sameObjects(const std::vector<std::shared_ptr<T>> &a, const std::vector<std::shared_ptr<T>> &b)
-{
-    if (a.size() != b.size())
-        return false;
-    for (size_t i = 0; i < a.size(); ++i) {
-        if (a[i].get() != b[i].get())
-            return false;
-    }
-    return true;
-}
-} // namespace
 
 AppearanceViewDataModel::AppearanceViewDataModel(const ColorimetricCondition &condition)
     : m_colorimetricCondition(condition)

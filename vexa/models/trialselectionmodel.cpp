@@ -1,6 +1,7 @@
 #include "trialselectionmodel.h"
 
 #include "geometryfilter.h"
+#include "sameobjects_p.h"
 
 #include <colorimetry/colorconverter.h>
 #include <colorimetry/colordifferencecalculator.h>
@@ -29,17 +30,6 @@ const Geometry &defaultTextureGeometry()
 {
     static const Geometry g(Geometry::ANGLE_15as15);
     return g;
-}
-
-bool sameTrials(const std::vector<std::shared_ptr<Trial>> &a, const std::vector<std::shared_ptr<Trial>> &b)
-{
-    if (a.size() != b.size())
-        return false;
-    for (size_t i = 0; i < a.size(); ++i) {
-        if (a[i].get() != b[i].get())
-            return false;
-    }
-    return true;
 }
 
 // The median is judged under one fixed condition, whatever the page shows.
@@ -108,7 +98,7 @@ void TrialSelectionModel::setSelectedTrial(const std::shared_ptr<Trial> &trial)
 
 void TrialSelectionModel::setActiveTrials(const std::vector<std::shared_ptr<Trial>> &trials, bool force)
 {
-    if (!force && sameTrials(trials, m_activeTrials))
+    if (!force && sameObjects(trials, m_activeTrials))
         return;
     m_activeTrials = trials;
     Q_EMIT sgActiveTrialsChanged();
