@@ -8,8 +8,12 @@
 #include <domain/tagdefinition.h>
 #include <domain/tagvalue.h>
 #include <domain/texturevalues.h>
+#include <sampledata/sampledata.h>
+#include <store/objectcodec.h>
+#include <store/sqliteobjectstore.h>
 
 #include <QSignalSpy>
+#include <QTemporaryDir>
 #include <QtTest>
 
 #include <map>
@@ -47,6 +51,38 @@ std::set<Geometry> geometrySet(const QString &text)
     return set;
 }
 
+// The trial nearest to the mean colour by CIEDE2000 under D65/10, averaged over the
+// given geometries, computed the long way.
+QString bruteForceMedian(const std::vector<std::shared_ptr<Trial>> &trials, const QVector<Geometry> &geometries)
+{
+    const ColorimetricCondition d65(QStringLiteral("D65"), QStringLiteral("10"));
+    std::map<Geometry, std::array<double, 3>> mean;
+    for (const auto &t : trials)
+        for (const Geometry &g : geometries) {
+            const LabValue lab = ColorConverter::toLabValue(*t->appearanceValues(), g, d65);
+            auto &m = mean[g];
+            m[0] += lab.l() / trials.size();
+            m[1] += lab.a() / trials.size();
+            m[2] += lab.b() / trials.size();
+        }
+    QString nearest;
+    double best = 1e9;
+    for (const auto &t : trials) {
+        double sum = 0;
+        for (const Geometry &g : geometries) {
+            const auto &m = mean[g];
+            sum += ColorDifferenceCalculator::Default_DE("CIE2000", LabValue(m[0], m[1], m[2], d65),
+                                                         ColorConverter::toLabValue(*t->appearanceValues(), g, d65),
+                                                         1, 1, 1);
+        }
+        if (sum / geometries.size() < best) {
+            best = sum / geometries.size();
+            nearest = t->name();
+        }
+    }
+    return nearest;
+}
+
 } // namespace
 
 class tst_TrialSelectionModel : public QObject
@@ -62,6 +98,7 @@ private Q_SLOTS:
     void groupsByTagValue();
     void medianIsNearestToMean();
     void medianEdgeCases();
+    void medianAndAverageOfSampleData();
     void averageIsElementwiseMean();
     void averageSkipsMismatchedLayouts();
 
@@ -274,34 +311,7 @@ void tst_TrialSelectionModel::medianIsNearestToMean()
         trials.push_back(fixtures::trial(QStringLiteral("T%1").arg(i), bases[i], fixtures::threeAngles(),
                                          530 + 5 * i));
 
-    // Brute force: mean L*a*b* per geometry under D65/10, then the trial with the smallest
-    // average CIEDE2000 to it.
-    const ColorimetricCondition d65(QStringLiteral("D65"), QStringLiteral("10"));
-    const auto geometries = Geometry::geometriesMultiAngleSimple();
-    std::map<Geometry, std::array<double, 3>> mean;
-    for (const auto &t : trials)
-        for (const Geometry &g : geometries) {
-            const LabValue lab = ColorConverter::toLabValue(*t->appearanceValues(), g, d65);
-            auto &m = mean[g];
-            m[0] += lab.l() / trials.size();
-            m[1] += lab.a() / trials.size();
-            m[2] += lab.b() / trials.size();
-        }
-    QString expected;
-    double best = 1e9;
-    for (const auto &t : trials) {
-        double sum = 0;
-        for (const Geometry &g : geometries) {
-            const auto &m = mean[g];
-            sum += ColorDifferenceCalculator::Default_DE("CIE2000", LabValue(m[0], m[1], m[2], d65),
-                                                         ColorConverter::toLabValue(*t->appearanceValues(), g, d65),
-                                                         1, 1, 1);
-        }
-        if (sum / 3 < best) {
-            best = sum / 3;
-            expected = t->name();
-        }
-    }
+    const QString expected = bruteForceMedian(trials, Geometry::geometriesMultiAngleSimple());
 
     TrialSelectionModel model;
     // The page's filter does not change which geometries take part when it names them all.
@@ -337,6 +347,52 @@ void tst_TrialSelectionModel::medianEdgeCases()
     // A filter naming a geometry nobody measured: no median either.
     model.setColorGeometryFilter({Geometry("15as80")});
     QVERIFY(!model.getMedianAppearanceValue({m_trials["A"], m_trials["B"]}));
+}
+
+// The 30 trials of the sample store's silver metallic, six geometries each.
+void tst_TrialSelectionModel::medianAndAverageOfSampleData()
+{
+    QTemporaryDir dir;
+    SqliteObjectStore store(dir.filePath("sample.vexastore"));
+    ErrorInfo error;
+    QVERIFY(store.open(&error));
+    QVERIFY(SampleData::populate(store, &error));
+    std::vector<std::shared_ptr<Trial>> trials;
+    store.visitAll(
+        [&](const StoreRecord &record) {
+            if (record.type == Trial::typeId() && record.name.startsWith("Silver Metallic"))
+                trials.push_back(std::dynamic_pointer_cast<Trial>(ObjectCodec::fromRecord(record, &error)));
+            return true;
+        },
+        &error);
+    QCOMPARE(trials.size(), size_t(SampleData::TrialsPerStandard));
+
+    TrialSelectionModel model;
+    const auto median = model.getMedianAppearanceValue(trials);
+    QVERIFY(median);
+    // The copy keeps the ids of the median trial's values (their name is empty in the sample data).
+    const QString expected = bruteForceMedian(trials, Geometry::geometries(GeometrySet::MultiAngle));
+    const auto medianTrial = std::find_if(trials.begin(), trials.end(),
+                                          [&](const std::shared_ptr<Trial> &t) { return t->name() == expected; });
+    QVERIFY(medianTrial != trials.end());
+    QCOMPARE(median->id(), (*medianTrial)->appearanceValues()->id());
+    QVERIFY(median.get() != (*medianTrial)->appearanceValues().get());
+
+    // The average: elementwise mean of the spectra at every position; the median's texture.
+    const auto averaged = model.averagedTrialMeasurements(trials);
+    QVERIFY(averaged);
+    QCOMPARE(averaged->colorValues().size(), size_t(6));
+    for (size_t k = 0; k < 6; ++k) {
+        const auto avg = std::dynamic_pointer_cast<ReflectanceSpectrum>(averaged->colorValues()[k]);
+        for (int i = 0; i < avg->spectralValues().size(); i += 7) {
+            double sum = 0;
+            for (const auto &t : trials)
+                sum += std::dynamic_pointer_cast<ReflectanceSpectrum>(t->appearanceValues()->colorValues()[k])
+                           ->spectralValues()[i];
+            QVERIFY(std::abs(avg->spectralValues()[i] - sum / trials.size()) < 1e-12);
+        }
+    }
+    QCOMPARE(averaged->textureValues().size(), median->textureValues().size());
 }
 
 void tst_TrialSelectionModel::averageIsElementwiseMean()
