@@ -6,16 +6,26 @@
 
 namespace {
 
+// One line per verb: its usage, then its help in a column; a usage too long for the
+// column puts the help on the next line.
 void printHelp(QTextStream &out)
 {
+    constexpr int MaxColumn = 48;
     out << "Usage: vexa-tool VERB [ARGUMENTS]\n\nVerbs:\n";
     int width = 4;
-    for (const Verb &verb : VerbRegistry::instance().verbs())
-        width = std::max(width, int((verb.name + QLatin1Char(' ') + verb.arguments).size()));
+    for (const Verb &verb : VerbRegistry::instance().verbs()) {
+        const int length = int((verb.name + QLatin1Char(' ') + verb.arguments).trimmed().size());
+        if (length <= MaxColumn)
+            width = std::max(width, length);
+    }
     out << "  " << QStringLiteral("help").leftJustified(width) << "  Show this help\n";
-    for (const Verb &verb : VerbRegistry::instance().verbs())
-        out << "  " << (verb.name + QLatin1Char(' ') + verb.arguments).trimmed().leftJustified(width) << "  " << verb.help
-            << "\n";
+    for (const Verb &verb : VerbRegistry::instance().verbs()) {
+        const QString usage = (verb.name + QLatin1Char(' ') + verb.arguments).trimmed();
+        if (usage.size() > width)
+            out << "  " << usage << "\n  " << QString(width, QLatin1Char(' ')) << "  " << verb.help << "\n";
+        else
+            out << "  " << usage.leftJustified(width) << "  " << verb.help << "\n";
+    }
 }
 
 } // namespace
