@@ -72,8 +72,10 @@ int Tolerance::status(const AppearanceValues &trial, const AppearanceValues &sta
 
 int Tolerance::statusOfNormalizedDifference(double normalizedDifference) const
 {
-    if (std::isnan(normalizedDifference))
-        return ToleranceJudgement::NoVerdict;
+    // A difference that cannot be a number while data are present fails: a broken value
+    // must never pass. Missing data is the rule's call (no verdict) before it gets here.
+    if (!std::isfinite(normalizedDifference))
+        return ToleranceJudgement::Fail;
     if (normalizedDifference <= m_checkThreshold)
         return ToleranceJudgement::Pass;
     if (normalizedDifference <= m_passThreshold)

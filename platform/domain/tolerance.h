@@ -55,7 +55,7 @@ public:
     int status(const AppearanceValues &trial, const AppearanceValues &standard,
                const ColorimetricCondition &condition) const;
     // The status of a normalized difference under this tolerance's thresholds
-    // (NaN: 0; <= checkThreshold: 1; <= passThreshold: 2; else 3). For rules.
+    // (<= checkThreshold: 1; <= passThreshold: 2; else, NaN and infinity included, 3). For rules.
     int statusOfNormalizedDifference(double normalizedDifference) const;
 
 private:

@@ -70,6 +70,8 @@ private Q_SLOTS:
     void standardMeasurements();
     void toleranceJudgement_data();
     void toleranceJudgement();
+    void statusOfNormalizedDifference_data();
+    void statusOfNormalizedDifference();
     void toleranceWithoutRuleGivesNoVerdict();
     void ruleRegistryFromThreads();
     void formulaHelpers();
@@ -157,6 +159,27 @@ void tst_DomainObjects::toleranceJudgement()
     AppearanceValues empty;
     QCOMPARE(found->judge(empty, standard, ColorimetricCondition()).status, 0);
     ToleranceRuleRegistry::instance().unregisterRule(QStringLiteral("test-dL"));
+}
+
+void tst_DomainObjects::statusOfNormalizedDifference_data()
+{
+    QTest::addColumn<double>("difference");
+    QTest::addColumn<int>("status");
+    QTest::newRow("inside") << 0.5 << 1;
+    QTest::newRow("at the check threshold") << 0.8 << 1;
+    QTest::newRow("warning band") << 0.9 << 2;
+    QTest::newRow("at the pass threshold") << 1.0 << 2;
+    QTest::newRow("outside") << 1.5 << 3;
+    QTest::newRow("NaN never passes") << qQNaN() << 3;
+    QTest::newRow("infinity") << qInf() << 3;
+}
+
+void tst_DomainObjects::statusOfNormalizedDifference()
+{
+    QFETCH(double, difference);
+    QFETCH(int, status);
+    Tolerance tolerance; // thresholds 0.8 and 1.0
+    QCOMPARE(tolerance.statusOfNormalizedDifference(difference), status);
 }
 
 void tst_DomainObjects::toleranceWithoutRuleGivesNoVerdict()
