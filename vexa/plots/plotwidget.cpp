@@ -12,6 +12,7 @@
 
 #include <colorimetry/colorconverter.h>
 #include <domain/appearancevalues.h>
+#include <domain/rgbvalue.h>
 #include <domain/standard.h>
 #include <domain/tolerance.h>
 #include <domain/trial.h>
@@ -525,10 +526,17 @@ void PlotWidget::buildAxes()
             m_tickLabels.append(label);
         }
     }
+    // The axis names sit inside the frame: on the a*b* plane's tinted background they take the label colour
+    // that reads on the standard's colour.
+    QColor titleColor(50, 50, 50);
+    if (m_plane == Plane::AB && showTintedBackgroundSetting() && m_standardLab && m_standardLab->isValid()) {
+        const RGBValue rgb = ColorConverter::toRGB(*m_standardLab);
+        titleColor = labelColorFor(QColor(rgb.R(), rgb.G(), rgb.B()));
+    }
     if (!m_horizontalTitle.isEmpty()) {
         auto *title = new TextItem(m_horizontalTitle);
         title->setFont(titleFont);
-        title->setTextColor(QColor(50, 50, 50));
+        title->setTextColor(titleColor);
         title->setAlignment(Qt::AlignRight | Qt::AlignBottom);
         title->setOffset(4);
         title->setPos(frame.bottomRight());
@@ -538,7 +546,7 @@ void PlotWidget::buildAxes()
     if (!m_verticalTitle.isEmpty()) {
         auto *title = new TextItem(m_verticalTitle);
         title->setFont(titleFont);
-        title->setTextColor(QColor(50, 50, 50));
+        title->setTextColor(titleColor);
         title->setAlignment(Qt::AlignLeft | Qt::AlignTop);
         title->setOffset(4);
         title->setPos(frame.topLeft());
