@@ -77,7 +77,7 @@ void StoreSession::ensureContents()
     CommandDispatcher *d = dispatcher();
     Q_EMIT sgBusy(tr("Opening"), true);
     QPointer<StoreSession> self(this);
-    d->runWithStore([self](ObjectStore *store) {
+    d->runWithStore([self, d](ObjectStore *store) {
         QString problem;
         if (!store) {
             problem = QStringLiteral("no connection");
@@ -89,8 +89,7 @@ void StoreSession::ensureContents()
             else if (count < 0)
                 problem = error.message();
         }
-        QMetaObject::invokeMethod(
-            QCoreApplication::instance(),
+        d->runOnOwnerThread(
             [self, problem] {
                 if (!self)
                     return;
@@ -99,8 +98,7 @@ void StoreSession::ensureContents()
                     Q_EMIT self->sgOpened();
                 else
                     Q_EMIT self->sgError(tr("The sample data could not be written: %1").arg(problem));
-            },
-            Qt::QueuedConnection);
+            });
     });
 }
 

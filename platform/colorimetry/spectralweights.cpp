@@ -2,8 +2,7 @@
 
 #include <colorimetry/cietables.h>
 
-#include <QMutex>
-#include <QMutexLocker>
+#include <mutex>
 
 #include <algorithm>
 #include <cmath>
@@ -101,18 +100,18 @@ std::shared_ptr<const SpectralWeights> SpectralWeights::forGrid(const QString &i
     if (count == 1)
         interval = 1.0;
 
-    static QMutex mutex;
+    static std::mutex mutex;
     static std::map<GridKey, std::shared_ptr<const SpectralWeights>> cache;
     const GridKey key(illuminantKey, observerKey, start, interval, count);
     {
-        QMutexLocker locker(&mutex);
+        std::lock_guard<std::mutex> locker(mutex);
         const auto found = cache.find(key);
         if (found != cache.end())
             return found->second;
     }
     // Computed outside the lock: two threads may compute the same grid once each, which is harmless.
     std::shared_ptr<const SpectralWeights> weights = compute(illuminantKey, observerKey, start, interval, count);
-    QMutexLocker locker(&mutex);
+    std::lock_guard<std::mutex> locker(mutex);
     if (cache.size() >= kMaxCachedGrids)
         cache.clear();
     return cache.emplace(key, weights).first->second;

@@ -2,13 +2,13 @@
 
 #include <context/command.h>
 #include <context/commandworker.h>
+#include <context/functionevent_p.h>
 #include <context/progress.h>
 #include <context/qtcommand.h>
 #include <context/response.h>
 
 #include <QDir>
 #include <QFileInfo>
-#include <QMutexLocker>
 #include <QThread>
 
 namespace vexa {
@@ -48,10 +48,15 @@ CommandDispatcher::~CommandDispatcher()
 {
     // Close the store on its own thread, then stop the thread.
     CommandWorker *worker = m_worker;
-    QMetaObject::invokeMethod(
-        m_worker, [worker] { worker->shutdown(); }, Qt::BlockingQueuedConnection);
-    m_thread->quit();
+    // The shutdown is the worker thread's last work: the thread ends after it, and
+    // wait() returns only then.
+    FunctionEvent::post(m_worker, [worker, thread = m_thread] {
+        worker->shutdown();
+        FunctionEvent::release(worker);
+        thread->quit();
+    });
     m_thread->wait();
+    FunctionEvent::acquire(worker);
     delete m_worker;
     delete m_thread;
 }
@@ -81,7 +86,7 @@ CommandDispatcher::ConnectionState CommandDispatcher::connectionState() const
 
 ErrorInfo CommandDispatcher::connectionError() const
 {
-    QMutexLocker lock(&m_errorMutex);
+    std::lock_guard<std::mutex> lock(m_errorMutex);
     return m_connectionError;
 }
 
@@ -100,19 +105,25 @@ void CommandDispatcher::connectToServer()
     Q_EMIT sgConnectionStateChanged(ConnectionState::Connecting);
     CommandWorker *worker = m_worker;
     const bool refuse = m_refuse.load();
-    QMetaObject::invokeMethod(
-        m_worker,
-        [worker, refuse, this] {
-            worker->openStore(refuse, [this](int state, ErrorInfo error) {
-                {
-                    QMutexLocker lock(&m_errorMutex);
-                    m_connectionError = error;
-                }
-                QMetaObject::invokeMethod(
-                    this, [this, state, error] { onConnectionResult(state, error); }, Qt::QueuedConnection);
-            });
-        },
-        Qt::QueuedConnection);
+    FunctionEvent::post(m_worker, [worker, refuse, this] {
+        worker->openStore(refuse, [this](int state, ErrorInfo error) {
+            {
+                std::lock_guard<std::mutex> lock(m_errorMutex);
+                m_connectionError = error;
+            }
+            FunctionEvent::post(this, [this, state, error] { onConnectionResult(state, error); });
+        });
+    });
+}
+
+bool CommandDispatcher::event(QEvent *event)
+{
+    return FunctionEvent::handle(this, event) || QObject::event(event);
+}
+
+void CommandDispatcher::runOnOwnerThread(std::function<void()> function)
+{
+    FunctionEvent::post(this, std::move(function));
 }
 
 void CommandDispatcher::onConnectionResult(int state, const ErrorInfo &error)
@@ -133,20 +144,16 @@ QtCommand *CommandDispatcher::execute(std::shared_ptr<Command> command)
     m_pending[id] = qtCommand;
     CommandWorker::Callbacks callbacks;
     callbacks.response = [this, id](std::shared_ptr<Response> response) {
-        QMetaObject::invokeMethod(
-            this, [this, id, response] { deliverResponse(id, response); }, Qt::QueuedConnection);
+        FunctionEvent::post(this, [this, id, response] { deliverResponse(id, response); });
     };
     callbacks.error = [this, id](std::shared_ptr<ErrorInfo> error) {
-        QMetaObject::invokeMethod(
-            this, [this, id, error] { deliverError(id, error); }, Qt::QueuedConnection);
+        FunctionEvent::post(this, [this, id, error] { deliverError(id, error); });
     };
     callbacks.progress = [this, id](std::shared_ptr<Progress> progress) {
-        QMetaObject::invokeMethod(
-            this, [this, id, progress] { deliverProgress(id, progress); }, Qt::QueuedConnection);
+        FunctionEvent::post(this, [this, id, progress] { deliverProgress(id, progress); });
     };
     CommandWorker *worker = m_worker;
-    QMetaObject::invokeMethod(
-        m_worker, [worker, command, callbacks] { worker->run(command, callbacks); }, Qt::QueuedConnection);
+    FunctionEvent::post(m_worker, [worker, command, callbacks] { worker->run(command, callbacks); });
     return qtCommand;
 }
 
@@ -168,8 +175,7 @@ std::string CommandDispatcher::execute(std::shared_ptr<Command> command, QObject
 void CommandDispatcher::runWithStore(std::function<void(ObjectStore *)> job)
 {
     CommandWorker *worker = m_worker;
-    QMetaObject::invokeMethod(
-        m_worker, [worker, job] { worker->runWithStore(job); }, Qt::QueuedConnection);
+    FunctionEvent::post(m_worker, [worker, job] { worker->runWithStore(job); });
 }
 
 void CommandDispatcher::deliverResponse(const std::string &id, const std::shared_ptr<Response> &response)

@@ -5,7 +5,7 @@
 
 #include <store/errorinfo.h>
 
-#include <QMutex>
+#include <mutex>
 #include <QObject>
 #include <QPointer>
 
@@ -74,9 +74,15 @@ public:
     // Runs a job with the open store (null when not connected) on the worker
     // thread, queued behind the commands sent before (tools, sample data).
     void runWithStore(std::function<void(ObjectStore *)> job);
+    // Runs a function on the dispatcher's thread (the GUI thread); a job on the worker
+    // hands its results back with it.
+    void runOnOwnerThread(std::function<void()> function);
 
 Q_SIGNALS:
     void sgConnectionStateChanged(vexa::CommandDispatcher::ConnectionState state);
+
+protected:
+    bool event(QEvent *event) override;
 
 private:
     void deliverResponse(const std::string &id, const std::shared_ptr<Response> &response);
@@ -89,7 +95,7 @@ private:
     CommandWorker *m_worker = nullptr; // Owned; lives on m_thread.
     std::atomic<int> m_state{int(ConnectionState::Disconnected)};
     std::atomic<bool> m_refuse{false};
-    mutable QMutex m_errorMutex;
+    mutable std::mutex m_errorMutex;
     ErrorInfo m_connectionError;
     std::map<std::string, QPointer<QtCommand>> m_pending;
 };

@@ -1,4 +1,5 @@
 #include <context/commandworker.h>
+#include <context/functionevent_p.h>
 
 #include <context/command.h>
 #include <context/commanddispatcher.h>
@@ -15,6 +16,11 @@
 #include <exception>
 
 namespace vexa {
+
+bool CommandWorker::event(QEvent *event)
+{
+    return FunctionEvent::handle(this, event) || QObject::event(event);
+}
 
 CommandWorker::CommandWorker(const QString &storePath, std::atomic<int> *state)
     : m_storePath(storePath)

@@ -42,6 +42,9 @@ private:
     QString m_storePath;
     std::atomic<int> *m_state; // Owned by the dispatcher.
     std::unique_ptr<ObjectStore> m_store;
+
+protected:
+    bool event(QEvent *event) override;
 };
 
 } // namespace vexa

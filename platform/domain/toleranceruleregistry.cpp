@@ -12,7 +12,7 @@ ToleranceRuleRegistry &ToleranceRuleRegistry::instance()
 
 void ToleranceRuleRegistry::registerRule(const QString &toleranceType, std::shared_ptr<const ToleranceRule> rule)
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     if (rule)
         m_rules.insert(toleranceType, std::move(rule));
     else
@@ -21,19 +21,19 @@ void ToleranceRuleRegistry::registerRule(const QString &toleranceType, std::shar
 
 void ToleranceRuleRegistry::unregisterRule(const QString &toleranceType)
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     m_rules.remove(toleranceType);
 }
 
 std::shared_ptr<const ToleranceRule> ToleranceRuleRegistry::rule(const QString &toleranceType) const
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     return m_rules.value(toleranceType);
 }
 
 QStringList ToleranceRuleRegistry::toleranceTypes() const
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     QStringList types = m_rules.keys();
     std::sort(types.begin(), types.end());
     return types;

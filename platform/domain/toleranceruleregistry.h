@@ -4,7 +4,7 @@
 #include <domain/tolerancerule.h>
 
 #include <QHash>
-#include <QMutex>
+#include <mutex>
 #include <QStringList>
 
 #include <memory>
@@ -27,7 +27,7 @@ private:
     ToleranceRuleRegistry() = default;
     Q_DISABLE_COPY(ToleranceRuleRegistry)
 
-    mutable QMutex m_mutex;
+    mutable std::mutex m_mutex;
     QHash<QString, std::shared_ptr<const ToleranceRule>> m_rules;
 };
 

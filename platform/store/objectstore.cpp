@@ -1,7 +1,6 @@
 #include <store/objectstore.h>
 
-#include <QMutex>
-#include <QMutexLocker>
+#include <mutex>
 #include <QSet>
 
 namespace vexa {
@@ -10,7 +9,7 @@ namespace {
 
 struct TypeRegistry
 {
-    QMutex mutex;
+    std::mutex mutex;
     QStringList types{
         QStringLiteral("Assortment"), QStringLiteral("ColorStandardsLibrary"), QStringLiteral("Colorant"),
         QStringLiteral("DatabaseConfiguration"), QStringLiteral("DirEntry"), QStringLiteral("Domain"),
@@ -41,13 +40,13 @@ QString ObjectStore::rootFolderId() const
 
 QStringList ObjectStore::knownTypes()
 {
-    QMutexLocker lock(&registry().mutex);
+    std::lock_guard<std::mutex> lock(registry().mutex);
     return registry().types;
 }
 
 bool ObjectStore::isKnownType(const QString &type)
 {
-    QMutexLocker lock(&registry().mutex);
+    std::lock_guard<std::mutex> lock(registry().mutex);
     return registry().types.contains(type);
 }
 
@@ -55,7 +54,7 @@ void ObjectStore::registerType(const QString &type)
 {
     if (type.isEmpty())
         return;
-    QMutexLocker lock(&registry().mutex);
+    std::lock_guard<std::mutex> lock(registry().mutex);
     if (!registry().types.contains(type))
         registry().types.append(type);
 }

@@ -1,7 +1,6 @@
 #include "logger.h"
 
 #include <QDebug>
-#include <QMutexLocker>
 
 QString logCategoryName(LogCategory category)
 {
@@ -42,26 +41,26 @@ void Logger::registerLogger(LogInterface *sink)
 {
     if (!sink)
         return;
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     if (!m_sinks.contains(sink))
         m_sinks.append(sink);
 }
 
 void Logger::unregisterLogger(LogInterface *sink)
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     m_sinks.removeAll(sink);
 }
 
 void Logger::setAlwaysUseQtLog(bool on)
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     m_alwaysQt = on;
 }
 
 void Logger::write(LogLevel level, LogCategory category, const QString &message)
 {
-    QMutexLocker lock(&m_mutex);
+    std::lock_guard<std::mutex> lock(m_mutex);
     for (LogInterface *sink : qAsConst(m_sinks))
         sink->log(level, category, message);
     if (m_sinks.isEmpty() || m_alwaysQt) {

@@ -2,7 +2,7 @@
 
 #include <utilities/utilities_export.h>
 
-#include <QMutex>
+#include <mutex>
 #include <QString>
 #include <QVector>
 
@@ -50,7 +50,7 @@ private:
     Logger() = default;
     void write(LogLevel level, LogCategory category, const QString &message);
 
-    QMutex m_mutex;
+    std::mutex m_mutex;
     QVector<LogInterface *> m_sinks; // Not owned.
     bool m_alwaysQt = false;
 };

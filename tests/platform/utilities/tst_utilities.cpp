@@ -5,6 +5,8 @@
 
 #include <QRegularExpression>
 #include <QThread>
+
+#include <mutex>
 #include <QtTest>
 
 #include <cmath>
@@ -18,11 +20,11 @@ class RecordingSink : public LogInterface
 public:
     void log(LogLevel level, LogCategory category, const QString &message) override
     {
-        QMutexLocker lock(&mutex);
+        std::lock_guard<std::mutex> lock(mutex);
         lines << QStringLiteral("%1|%2|%3")
                      .arg(level == LogLevel::Error ? "E" : "D", logCategoryName(category), message);
     }
-    QMutex mutex;
+    std::mutex mutex;
     QStringList lines;
 };
 } // namespace
