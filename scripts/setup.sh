@@ -31,7 +31,7 @@ PACKAGES=(
     build-essential cmake ninja-build ccache pkg-config
     qtbase5-dev qtbase5-dev-tools libqt5sql5-sqlite libqt5svg5-dev
     qttools5-dev qttools5-dev-tools
-    liblcms2-dev libxlsxwriter-dev libbenchmark-dev
+    liblcms2-dev libxlsxwriter-dev libbenchmark-dev libsqlite3-dev
     python3-openpyxl xvfb xauth
 )
 

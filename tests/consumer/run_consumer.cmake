@@ -1,6 +1,8 @@
 file(REMOVE_RECURSE "${BINARY}")
 execute_process(COMMAND ${CMAKE_COMMAND} -S "${SOURCE}" -B "${BINARY}" -G "${GENERATOR}"
                         "-DCMAKE_PREFIX_PATH=${PREFIX}"
+                        "-DCMAKE_CXX_FLAGS=${FLAGS}"
+                        "-DCMAKE_EXE_LINKER_FLAGS=${FLAGS}"
                 RESULT_VARIABLE rc)
 if(rc)
     message(FATAL_ERROR "consumer: configure failed against ${PREFIX} (run 'cmake --install' first)")

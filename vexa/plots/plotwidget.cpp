@@ -111,6 +111,10 @@ PlotWidget::~PlotWidget()
     disconnect(m_worker.get(), nullptr, this, nullptr);
     m_worker->stop();
     m_trialItems.clear();
+    // The scene dies with the widget's children, after this destructor: its items'
+    // selection changes must not call back into a plot that is already gone.
+    if (m_scene)
+        disconnect(m_scene, nullptr, this, nullptr);
 }
 
 void PlotWidget::initialize(ZoomGraphicsView *view, const QRect &sceneRect, const QString &horizontalTitle,
