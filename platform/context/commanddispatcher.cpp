@@ -178,25 +178,26 @@ void CommandDispatcher::runWithStore(std::function<void(ObjectStore *)> job)
     FunctionEvent::post(m_worker, [worker, job] { worker->runWithStore(job); });
 }
 
-void CommandDispatcher::deliverResponse(const std::string &id, const std::shared_ptr<Response> &response)
+// The final answer of a command: the command leaves the pending table once.
+QPointer<QtCommand> CommandDispatcher::takePending(const std::string &id)
 {
     const auto it = m_pending.find(id);
     if (it == m_pending.end())
-        return;
+        return nullptr;
     QPointer<QtCommand> qtCommand = it->second;
     m_pending.erase(it);
-    if (qtCommand)
+    return qtCommand;
+}
+
+void CommandDispatcher::deliverResponse(const std::string &id, const std::shared_ptr<Response> &response)
+{
+    if (QPointer<QtCommand> qtCommand = takePending(id))
         qtCommand->deliverResponse(response);
 }
 
 void CommandDispatcher::deliverError(const std::string &id, const std::shared_ptr<ErrorInfo> &error)
 {
-    const auto it = m_pending.find(id);
-    if (it == m_pending.end())
-        return;
-    QPointer<QtCommand> qtCommand = it->second;
-    m_pending.erase(it);
-    if (qtCommand)
+    if (QPointer<QtCommand> qtCommand = takePending(id))
         qtCommand->deliverError(error);
 }
 

@@ -85,6 +85,7 @@ protected:
     bool event(QEvent *event) override;
 
 private:
+    QPointer<QtCommand> takePending(const std::string &id);
     void deliverResponse(const std::string &id, const std::shared_ptr<Response> &response);
     void deliverError(const std::string &id, const std::shared_ptr<ErrorInfo> &error);
     void deliverProgress(const std::string &id, const std::shared_ptr<Progress> &progress);
