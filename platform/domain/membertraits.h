@@ -684,14 +684,13 @@ struct MemberTraits<std::shared_ptr<T>, std::enable_if_t<std::is_base_of<Reflect
     }
 };
 
-// A list of owned nested objects, each with its "$type".
-template<class T>
-struct MemberTraits<std::vector<std::shared_ptr<T>>, std::enable_if_t<std::is_base_of<Reflectable, T>::value>>
+// What a list of objects does with its items, shared by the owned and the referenced
+// lists: the stored form is an array of the items' forms, in order.
+template<class ItemTraits, class T>
+struct ObjectListOps
 {
-    using Item = MemberTraits<std::shared_ptr<T>>;
+    using Item = ItemTraits;
     using List = std::vector<std::shared_ptr<T>>;
-    static constexpr MemberKind kind = MemberKind::OwnedObjectList;
-    static QString innerType() { return T::typeId(); }
     static QJsonValue write(const List &v)
     {
         QJsonArray a;
@@ -750,6 +749,17 @@ struct MemberTraits<std::vector<std::shared_ptr<T>>, std::enable_if_t<std::is_ba
             l.append(Item::toVariant(item));
         return l;
     }
+};
+
+// A list of owned nested objects, each with its "$type".
+template<class T>
+struct MemberTraits<std::vector<std::shared_ptr<T>>, std::enable_if_t<std::is_base_of<Reflectable, T>::value>>
+    : ObjectListOps<MemberTraits<std::shared_ptr<T>>, T>
+{
+    using Item = MemberTraits<std::shared_ptr<T>>;
+    using List = std::vector<std::shared_ptr<T>>;
+    static constexpr MemberKind kind = MemberKind::OwnedObjectList;
+    static QString innerType() { return T::typeId(); }
     // One object of every registered kind that fits (a list of colour values gets
     // a reflectance, a Lab value, ...), so that every kind is covered.
     static List sample(SampleContext &c)
@@ -849,67 +859,12 @@ struct ReferenceTraits<std::shared_ptr<T>, std::enable_if_t<std::is_base_of<Base
 
 template<class T>
 struct ReferenceTraits<std::vector<std::shared_ptr<T>>, std::enable_if_t<std::is_base_of<BaseObject, T>::value>>
+    : ObjectListOps<ReferenceTraits<std::shared_ptr<T>>, T>
 {
     using Item = ReferenceTraits<std::shared_ptr<T>>;
     using List = std::vector<std::shared_ptr<T>>;
     static constexpr MemberKind kind = MemberKind::ReferenceList;
     static QString innerType() { return T::typeId(); }
-    static QJsonValue write(const List &v)
-    {
-        QJsonArray a;
-        for (const auto &item : v)
-            a.append(Item::write(item));
-        return a;
-    }
-    static bool read(const QJsonValue &j, List &v, ReadContext &c)
-    {
-        if (!j.isArray())
-            return expected(c, "an array", j);
-        const QJsonArray a = j.toArray();
-        List out;
-        for (int i = 0; i < a.size(); ++i) {
-            c.pushIndex(i);
-            std::shared_ptr<T> item;
-            const bool ok = Item::read(a.at(i), item, c);
-            c.pop();
-            if (!ok)
-                return false;
-            out.push_back(item);
-        }
-        v = out;
-        return true;
-    }
-    static List copy(const List &v, CopyContext &c)
-    {
-        List out;
-        for (const auto &item : v)
-            out.push_back(Item::copy(item, c));
-        return out;
-    }
-    static bool equal(const List &a, const List &b, QString *difference)
-    {
-        if (a.size() != b.size()) {
-            if (difference)
-                *difference = QStringLiteral(": %1 references != %2 references").arg(a.size()).arg(b.size());
-            return false;
-        }
-        for (size_t i = 0; i < a.size(); ++i) {
-            QString sub;
-            if (!Item::equal(a[i], b[i], &sub)) {
-                if (difference)
-                    *difference = QStringLiteral("[%1]").arg(i) + sub;
-                return false;
-            }
-        }
-        return true;
-    }
-    static QVariant toVariant(const List &v)
-    {
-        QVariantList l;
-        for (const auto &item : v)
-            l.append(Item::toVariant(item));
-        return l;
-    }
     static List sample(SampleContext &c) { return {Item::sample(c), Item::sample(c)}; }
     static void references(const List &v, std::vector<std::shared_ptr<BaseObject>> &out)
     {
