@@ -1,0 +1,3 @@
+#include <vexa/graph/graphdata.h>
+
+GraphData::~GraphData() = default;

@@ -1,0 +1,64 @@
+#pragma once
+
+#include <vexa/vexa_export.h>
+#include <vexa/graph/spectralselection.h>
+#include <vexa/models/appearanceviewbase.h>
+
+#include <QWidget>
+
+class QLabel;
+
+namespace vexa {
+
+class SpectralView;
+
+// The curve area of a spectral page with its title, following the page's models.
+//
+// At the selected geometry the first legend entry holds the active trials other than the
+// selected one (thin, pale), then come the standard (black) and the selected trial
+// (blue), drawn in that order so that the two compared curves lie on top. At all
+// geometries each geometry is one legend entry in its own colour: the selected trial's
+// curve solid, the standard's pale. Missing spectra are named in the view's note.
+class VEXA_EXPORT SpectralPlotWidget : public QWidget, public AppearanceViewBase
+{
+    Q_OBJECT
+public:
+    explicit SpectralPlotWidget(QWidget *parent = nullptr);
+    ~SpectralPlotWidget() override;
+
+    void setModels(const std::shared_ptr<AppearanceViewDataModel> &dataModel,
+                   const std::shared_ptr<TrialSelectionModel> &selectionModel) override;
+    void settingsChanged() override;
+
+    void setScope(SpectralScope scope);
+    SpectralScope scope() const { return m_scope; }
+
+    SpectralView *view() const { return m_view; }
+    QLabel *titleLabel() const { return m_title; }
+
+    // The colour of the n-th geometry at all geometries.
+    static QColor geometryColor(int n);
+
+public Q_SLOTS:
+    void refreshAll();
+
+protected:
+    void refreshStandard() override { refreshAll(); }
+    void refreshQCJob() override { refreshAll(); }
+    void refreshActiveTrials() override { refreshAll(); }
+    void refreshTrials() override { refreshAll(); }
+    void onTrialSelected() override { refreshAll(); }
+    void onActiveGeometriesChanged() override { refreshAll(); }
+    void onGeometrySelected() override { refreshAll(); }
+    void changeEvent(QEvent *event) override;
+
+private:
+    void fillSelectedGeometry(const std::vector<SpectralEntry> &entries);
+    void fillAllGeometries(const std::vector<SpectralEntry> &entries);
+
+    SpectralScope m_scope = SpectralScope::SelectedGeometry;
+    QLabel *m_title;      // Child.
+    SpectralView *m_view; // Child.
+};
+
+} // namespace vexa
