@@ -1,6 +1,7 @@
 #include "comparisonpage.h"
 
 #include "jobjudge.h"
+#include "spectralpage.h"
 #include "storesession.h"
 
 #include <vexa/models/appearanceviewdatamodel.h>
@@ -33,6 +34,7 @@
 #include <QListWidget>
 #include <QPainter>
 #include <QSplitter>
+#include <QTabWidget>
 #include <QVBoxLayout>
 
 #include <set>
@@ -80,7 +82,9 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     auto *splitter = new QSplitter(Qt::Horizontal, this);
     splitter->addWidget(buildControls());
 
-    auto *views = new QSplitter(Qt::Vertical, splitter);
+    m_tabs = new QTabWidget(splitter);
+    m_tabs->setObjectName(QStringLiteral("viewTabs"));
+    auto *views = new QSplitter(Qt::Vertical, m_tabs);
     m_tableModel = std::make_shared<MultiColorValueTableModel>(m_viewSettings->colorCompareSettings(), m_generalSettings);
     m_table = new MultiColorValueWidget(views);
     m_table->setObjectName(QStringLiteral("colorTable"));
@@ -100,7 +104,11 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     views->setStretchFactor(0, 1);
     views->setStretchFactor(1, 1);
     views->setSizes({400, 460});
-    splitter->addWidget(views);
+    m_spectral = new SpectralPage(m_tabs);
+    m_spectral->setObjectName(QStringLiteral("spectralPage"));
+    m_tabs->addTab(views, tr("Colour"));
+    m_tabs->addTab(m_spectral, tr("Spectra"));
+    splitter->addWidget(m_tabs);
     splitter->setStretchFactor(0, 0);
     splitter->setStretchFactor(1, 1);
     splitter->setSizes({260, 1000});
@@ -118,6 +126,7 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
 
     m_table->setModels(m_dataModel, m_selectionModel);
     m_plot->setModels(m_dataModel, m_selectionModel);
+    m_spectral->setModels(m_dataModel, m_selectionModel);
     m_toleranceSelector->setDataModel(m_dataModel);
 
     connect(m_selectionModel.get(), &TrialSelectionModel::sgTrialSelectionChanged, this,
@@ -131,6 +140,18 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
 }
 
 ComparisonPage::~ComparisonPage() = default;
+
+bool ComparisonPage::showViews(const QString &name)
+{
+    const QString key = name.trimmed().toLower();
+    if (key == QLatin1String("colour") || key == QLatin1String("color"))
+        m_tabs->setCurrentIndex(0);
+    else if (key == QLatin1String("spectra") || key == QLatin1String("spectral"))
+        m_tabs->setCurrentWidget(m_spectral);
+    else
+        return false;
+    return true;
+}
 
 QWidget *ComparisonPage::buildControls()
 {
@@ -300,6 +321,7 @@ void ComparisonPage::onFormulaChosen()
             selected << metric;
         metrics->setSelectedValues(selected);
     }
+    m_spectral->setDeltaEFormula(formula);
     settingsChanged();
 }
 
@@ -307,6 +329,7 @@ void ComparisonPage::settingsChanged()
 {
     m_table->settingsChanged();
     m_plot->settingsChanged();
+    m_spectral->settingsChanged();
 }
 
 // Keeps the trial list's ticks and current row in step with the selection model.

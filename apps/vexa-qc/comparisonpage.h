@@ -10,6 +10,7 @@ class QLabel;
 class QListWidget;
 class QListWidgetItem;
 class QSplitter;
+class QTabWidget;
 class GeneralSettings;
 
 namespace vexa {
@@ -20,15 +21,17 @@ class JobDetailViewSettings;
 class MultiColorValueTableModel;
 class MultiColorValueWidget;
 class QCJob;
+class SpectralPage;
 class ToleranceSelector;
 class Trial;
 class TrialSelectionModel;
 struct LoadedJob;
 
 // One comparison page: the trials of a job with check boxes (the active trials), the
-// geometry filter, the colorimetric condition and the ΔE formula on the left; the
-// colour table and the colour plots on the right. Every view shares the page's one
-// data model and one selection model.
+// geometry filter, the colorimetric condition and the ΔE formula on the left; on the
+// right the views in tabs: "Colour" (the colour table and the colour plots) and
+// "Spectra" (the spectral page). Every view shares the page's one data model and one
+// selection model.
 class ComparisonPage : public QWidget
 {
     Q_OBJECT
@@ -43,6 +46,10 @@ public:
     std::shared_ptr<TrialSelectionModel> selectionModel() const { return m_selectionModel; }
     MultiColorValueWidget *tableWidget() const { return m_table; }
     ColorPlotWidget *plotWidget() const { return m_plot; }
+    SpectralPage *spectralPage() const { return m_spectral; }
+    QTabWidget *viewTabs() const { return m_tabs; }
+    // Brings the tab of the views to the front: "colour" or "spectra". False for another name.
+    bool showViews(const QString &name);
     QListWidget *trialList() const { return m_trialList; }
     QListWidget *geometryList() const { return m_geometryList; }
 
@@ -75,6 +82,8 @@ private:
     ToleranceSelector *m_toleranceSelector = nullptr;
     MultiColorValueWidget *m_table = nullptr;
     ColorPlotWidget *m_plot = nullptr;
+    SpectralPage *m_spectral = nullptr;
+    QTabWidget *m_tabs = nullptr;
     std::vector<std::shared_ptr<Trial>> m_trials;
     bool m_updating = false;
 };

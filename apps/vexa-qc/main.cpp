@@ -80,6 +80,9 @@ int main(int argc, char **argv)
     QCommandLineOption screenshotOption(QStringLiteral("screenshot"),
                                         QStringLiteral("Render the window with the job to FILE (PNG) and exit."),
                                         QStringLiteral("FILE"));
+    QCommandLineOption pageOption(QStringLiteral("page"),
+                                  QStringLiteral("The views shown first: colour (default) or spectra."),
+                                  QStringLiteral("NAME"), QStringLiteral("colour"));
     QCommandLineOption judgeOption(QStringLiteral("judge"),
                                    QStringLiteral("Batch mode: judge every trial of the job and exit (0 no trial fails, 1 some fail, 2 error)."),
                                    QStringLiteral("JOB"));
@@ -88,7 +91,7 @@ int main(int argc, char **argv)
     QCommandLineOption conditionOption(QStringLiteral("condition"),
                                        QStringLiteral("Batch mode: the colorimetric condition (default D65/10)."),
                                        QStringLiteral("CONDITION"), QStringLiteral("D65/10"));
-    parser.addOptions({storeOption, jobOption, screenshotOption, judgeOption, xlsxOption, conditionOption});
+    parser.addOptions({storeOption, jobOption, screenshotOption, pageOption, judgeOption, xlsxOption, conditionOption});
     parser.process(app);
 
     const QString storePath = parser.isSet(storeOption) ? parser.value(storeOption) : StoreSession::defaultStorePath();
@@ -110,6 +113,10 @@ int main(int argc, char **argv)
     auto generalSettings = SettingsManager::instance().getGeneralSettings();
 
     MainWindow window(generalSettings, viewSettings);
+    if (!window.page()->showViews(parser.value(pageOption))) {
+        err << "--page: unknown page \"" << parser.value(pageOption) << "\" (colour, spectra)\n";
+        return 2;
+    }
     auto *watcher = new FirstPaintWatcher(clock, &app);
     window.page()->installEventFilter(watcher);
     QObject::connect(&window, &MainWindow::sgJobShown, watcher, [watcher] { watcher->armed = true; });

@@ -45,9 +45,10 @@ void scanRange(Axis &axis, const std::vector<std::shared_ptr<GraphData>> &data, 
         for (const std::shared_ptr<GraphData> &series : data) {
             forEachSeries(series, [&](const GraphData &d) {
                 for (const GraphPoint &p : d.points()) {
-                    const double v = (p.*coordinate)();
-                    if (!std::isfinite(v))
+                    // A point that cannot be drawn does not stretch either axis.
+                    if (!std::isfinite(p.x()) || !std::isfinite(p.y()))
                         continue;
+                    const double v = (p.*coordinate)();
                     found = true;
                     smallest = std::min(smallest, v);
                     largest = std::max(largest, v);
@@ -283,10 +284,13 @@ void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, int dep
         painter.setPen(QPen(color, m_curveWidth, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
         painter.setBrush(Qt::NoBrush);
         auto flush = [&] {
-            if (m_polyline.size() > 1) {
+            const bool onePixel = std::all_of(m_polyline.cbegin(), m_polyline.cend(), [&](const QPointF &p) {
+                return (p - m_polyline.front()).manhattanLength() < 0.5;
+            });
+            if (!onePixel) {
                 painter.drawPolyline(m_polyline);
-            } else if (m_polyline.size() == 1) {
-                // A lone point: a dot the curve's colour.
+            } else if (!m_polyline.isEmpty()) {
+                // A lone point (or points that all land on it): a dot the curve's colour.
                 const double r = std::max(1.5, m_curveWidth);
                 painter.save();
                 painter.setPen(Qt::NoPen);

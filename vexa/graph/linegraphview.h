@@ -27,8 +27,8 @@ class QPainter;
 // to 30 above the legend (or above the bottom margin). x ticks and the x axis line sit
 // on whole x values: their x is truncated to an integer before it is mapped.
 //
-// Points that are not finite numbers break a curve; a point without finite neighbours is
-// drawn as a dot. Curves are clipped to the plot rectangle.
+// Points that are not finite numbers break a curve and take no part in the ranges; a point
+// without finite neighbours is drawn as a dot. Curves are clipped to the plot rectangle.
 class VEXA_EXPORT LineGraphView : public QWidget
 {
     Q_OBJECT

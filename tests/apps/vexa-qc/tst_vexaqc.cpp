@@ -1,6 +1,11 @@
 #include "comparisonpage.h"
 #include "mainwindow.h"
+#include "spectralpage.h"
 
+#include <vexa/graph/metamerismview.h>
+#include <vexa/graph/spectralplotwidget.h>
+#include <vexa/graph/spectralvaluetablemodel.h>
+#include <vexa/graph/spectralview.h>
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/jobdetailviewsettings.h>
 #include <vexa/models/trialselectionmodel.h>
@@ -13,6 +18,7 @@
 
 #include <domain/domainmetatypes.h>
 #include <domain/qcjob.h>
+#include <domain/standard.h>
 #include <domain/trial.h>
 #include <settings/generalsettings.h>
 #include <settings/settingsmanager.h>
@@ -20,13 +26,16 @@
 
 #include <QComboBox>
 #include <QJsonArray>
+#include <QLabel>
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QListWidget>
 #include <QProcess>
 #include <QSignalSpy>
 #include <QSortFilterProxyModel>
+#include <QTabWidget>
 #include <QTableView>
+#include <QTableWidget>
 #include <QTemporaryDir>
 #include <QtTest>
 
@@ -42,6 +51,7 @@ private Q_SLOTS:
     void pageShowsTheFirstJob();
     void tableAndPlotFollowTheTrialList();
     void tableAndPlotFollowTheGeometryFilter();
+    void spectralPageFollowsTheSelection();
     void anotherJobReplacesThePage();
     void batchJudgeWritesTheWorkbook();
     void batchJudgeRejectsBadRequests_data();
@@ -149,6 +159,46 @@ void tst_VexaQc::tableAndPlotFollowTheGeometryFilter()
 
     found.front()->setCheckState(Qt::Unchecked);
     QCOMPARE(model->rowCount(), 6 * (1 + active));
+}
+
+void tst_VexaQc::spectralPageFollowsTheSelection()
+{
+    ComparisonPage *page = m_window->page();
+    QVERIFY(page->showViews("spectra"));
+    QCOMPARE(page->viewTabs()->currentWidget(), page->spectralPage());
+    QVERIFY(!page->showViews("nonsense"));
+    SpectralPage *spectral = page->spectralPage();
+    const auto trials = page->dataModel()->trials();
+    const QString name = trials[2]->name();
+
+    page->trialList()->setCurrentRow(2);
+    // The plot draws the selected trial last, after the standard.
+    const auto &series = spectral->plot()->view()->data();
+    QVERIFY(series.size() >= 2);
+    QCOMPARE(QString::fromStdString(series.back()->name()), name);
+    QCOMPARE(QString::fromStdString(series[series.size() - 2]->name()), page->dataModel()->standard()->name());
+    // The table highlights its columns; the metamerism readout compares it at six geometries.
+    const int column = spectral->tableModel()->columnOf(trials[2]);
+    QVERIFY(column > 0);
+    QCOMPARE(spectral->tableModel()->entryAt(column)->role, SpectralEntry::Role::SelectedTrial);
+    QCOMPARE(spectral->tableModel()->rowCount(), 31);
+    QVERIFY(spectral->metamerism()->titleLabel()->text().contains(name));
+    QCOMPARE(spectral->metamerism()->table()->rowCount(), 6);
+
+    // A click on another trial's column selects that trial everywhere.
+    const int other = spectral->tableModel()->columnOf(trials[5]);
+    QVERIFY(other > 0);
+    QMetaObject::invokeMethod(spectral->tableView(), "clicked", Q_ARG(QModelIndex, spectral->tableModel()->index(3, other)));
+    QCOMPARE(page->selectionModel()->selectedTrial(), trials[5]);
+    QCOMPARE(page->trialList()->currentRow(), 5);
+
+    // Every geometry of the selected trial.
+    spectral->scopeBox()->setCurrentIndex(1);
+    QCOMPARE(spectral->plot()->view()->data().size(), size_t(6));
+    QCOMPARE(spectral->tableModel()->columnCount(), 1 + 6 * 3);
+    QVERIFY(spectral->tableText().startsWith(QStringLiteral("nm\t")));
+    spectral->scopeBox()->setCurrentIndex(0);
+    QVERIFY(page->showViews("colour"));
 }
 
 void tst_VexaQc::anotherJobReplacesThePage()
