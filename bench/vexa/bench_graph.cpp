@@ -65,6 +65,7 @@ SpectralView &spectraView()
 void BM_PaintSpectra(benchmark::State &state)
 {
     SpectralView &view = spectraView();
+    view.setCurveWidth(state.range(0) / 10.0);
     QImage image(ViewSize, QImage::Format_ARGB32_Premultiplied);
     for (auto _ : state) {
         view.render(&image);
@@ -77,6 +78,7 @@ void BM_PaintSpectra(benchmark::State &state)
 void BM_PaintSpectraRawQPainter(benchmark::State &state)
 {
     SpectralView &view = spectraView();
+    view.setCurveWidth(state.range(0) / 10.0);
     QImage image(ViewSize, QImage::Format_ARGB32_Premultiplied);
     view.render(&image); // lays out the plot rectangle
     std::vector<QPolygonF> curves;
@@ -188,8 +190,9 @@ void BM_PaintCurves1000RawQPainter(benchmark::State &state)
 
 } // namespace
 
-BENCHMARK(BM_PaintSpectra)->Unit(benchmark::kMillisecond);
-BENCHMARK(BM_PaintSpectraRawQPainter)->Unit(benchmark::kMillisecond);
+// The argument is the curves' pen width in tenths of a pixel.
+BENCHMARK(BM_PaintSpectra)->Arg(10)->Arg(15)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_PaintSpectraRawQPainter)->Arg(10)->Arg(15)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_SelectTrialAndPaint1000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_PaintCurves1000RawQPainter)->Unit(benchmark::kMillisecond);
 

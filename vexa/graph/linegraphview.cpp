@@ -145,6 +145,8 @@ void LineGraphView::addData(const std::shared_ptr<GraphData> &data)
 
 void LineGraphView::clear()
 {
+    m_seriesWidths.clear();
+    m_cachedSeries.clear();
     m_xAxis.clearRange();
     m_yAxis.clearRange();
     m_info.clear();
@@ -164,6 +166,29 @@ void LineGraphView::setCurveWidth(double width)
         return;
     m_curveWidth = width;
     update();
+}
+
+void LineGraphView::setCurveWidth(int series, double width)
+{
+    if (!(width > 0.0) || !std::isfinite(width))
+        return;
+    m_seriesWidths[series] = width;
+    update();
+}
+
+void LineGraphView::setSeriesCached(int series, bool cached)
+{
+    if (cached)
+        m_cachedSeries.insert(series);
+    else
+        m_cachedSeries.erase(series);
+    update();
+}
+
+double LineGraphView::curveWidth(int series) const
+{
+    const auto it = m_seriesWidths.find(series);
+    return it == m_seriesWidths.end() ? m_curveWidth : it->second;
 }
 
 void LineGraphView::calculateRanges()
@@ -189,14 +214,23 @@ LineGraphView::LegendLayout LineGraphView::legendLayout(const QFontMetrics &metr
     return legend;
 }
 
-QPointF LineGraphView::toPixel(double x, double y) const
+LineGraphView::Mapping LineGraphView::mapping() const
 {
     const double left = m_plotRect.x();
     const double right = m_plotRect.x() + m_plotRect.width();
     const double top = m_plotRect.y();
     const double bottom = m_plotRect.y() + m_plotRect.height();
-    return QPointF(left + (x - mappingMin(m_xAxis)) * (right - left) / mappingSpan(m_xAxis),
-                   bottom - (y - mappingMin(m_yAxis)) * (bottom - top) / mappingSpan(m_yAxis));
+    Mapping map;
+    map.xScale = (right - left) / mappingSpan(m_xAxis);
+    map.x0 = left - mappingMin(m_xAxis) * map.xScale;
+    map.yScale = -(bottom - top) / mappingSpan(m_yAxis);
+    map.y0 = bottom - mappingMin(m_yAxis) * map.yScale;
+    return map;
+}
+
+QPointF LineGraphView::toPixel(double x, double y) const
+{
+    return mapping()(x, y);
 }
 
 void LineGraphView::paintEvent(QPaintEvent *)
@@ -259,29 +293,74 @@ void LineGraphView::paintEvent(QPaintEvent *)
             paintData(painter, m_data[size_t(i)], i);
         painter.restore();
     }
+    // Images of series no longer shown (or no longer cached) go.
+    m_layers.erase(std::remove_if(m_layers.begin(), m_layers.end(),
+                                  [this](const Layer &layer) {
+                                      const auto data = layer.data.lock();
+                                      for (int i : m_cachedSeries) {
+                                          if (i < int(m_data.size()) && data && m_data[size_t(i)] == data)
+                                              return false;
+                                      }
+                                      return true;
+                                  }),
+                   m_layers.end());
     paintLegend(painter, legend);
     paintNotes(painter);
 }
 
-void LineGraphView::paintData(QPainter &painter, const std::shared_ptr<GraphData> &data, int)
+void LineGraphView::paintData(QPainter &painter, const std::shared_ptr<GraphData> &data, int index)
 {
-    if (data)
-        paintCurve(painter, *data);
+    if (!data)
+        return;
+    if (isSeriesCached(index))
+        paintCachedCurve(painter, data, curveWidth(index));
+    else
+        paintCurve(painter, *data, curveWidth(index));
 }
 
-void LineGraphView::paintCurve(QPainter &painter, const GraphData &data)
+void LineGraphView::paintCachedCurve(QPainter &painter, const std::shared_ptr<GraphData> &data, double width)
 {
-    paintCurve(painter, data, 0);
+    const QRect rect = m_plotRect.adjusted(-1, -1, 1, 1);
+    const qreal ratio = painter.device() ? painter.device()->devicePixelRatioF() : 1.0;
+    auto matches = [&](const Layer &layer) {
+        return layer.data.lock() == data && layer.rect == rect && layer.xMin == m_xAxis.min()
+            && layer.xMax == m_xAxis.max() && layer.yMin == m_yAxis.min() && layer.yMax == m_yAxis.max()
+            && layer.width == width && layer.pixelRatio == ratio;
+    };
+    auto layer = std::find_if(m_layers.begin(), m_layers.end(), matches);
+    if (layer == m_layers.end()) {
+        m_layers.erase(std::remove_if(m_layers.begin(), m_layers.end(),
+                                      [&data](const Layer &l) { return l.data.lock() == data; }),
+                       m_layers.end());
+        Layer fresh{data, rect, m_xAxis.min(), m_xAxis.max(), m_yAxis.min(), m_yAxis.max(), width, ratio, QImage()};
+        fresh.image = QImage(rect.size() * ratio, QImage::Format_ARGB32_Premultiplied);
+        fresh.image.setDevicePixelRatio(ratio);
+        fresh.image.fill(Qt::transparent);
+        QPainter layerPainter(&fresh.image);
+        layerPainter.setRenderHints(painter.renderHints());
+        layerPainter.translate(-rect.topLeft());
+        paintCurve(layerPainter, *data, width);
+        layerPainter.end();
+        ++m_layerRenders;
+        m_layers.push_back(std::move(fresh));
+        layer = m_layers.end() - 1;
+    }
+    painter.drawImage(rect.topLeft(), layer->image);
 }
 
-void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, int depth)
+void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, double width)
+{
+    paintCurve(painter, data, width, mapping(), 0);
+}
+
+void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, double width, const Mapping &map, int depth)
 {
     if (depth > MaxDepth)
         return;
     const std::vector<GraphPoint> &points = data.points();
     if (!points.empty()) {
         const QColor color = data.color();
-        painter.setPen(QPen(color, m_curveWidth, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
+        painter.setPen(QPen(color, width, Qt::SolidLine, Qt::RoundCap, Qt::RoundJoin));
         painter.setBrush(Qt::NoBrush);
         auto flush = [&] {
             const bool onePixel = std::all_of(m_polyline.cbegin(), m_polyline.cend(), [&](const QPointF &p) {
@@ -291,7 +370,7 @@ void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, int dep
                 painter.drawPolyline(m_polyline);
             } else if (!m_polyline.isEmpty()) {
                 // A lone point (or points that all land on it): a dot the curve's colour.
-                const double r = std::max(1.5, m_curveWidth);
+                const double r = std::max(1.5, width);
                 painter.save();
                 painter.setPen(Qt::NoPen);
                 painter.setBrush(color);
@@ -304,7 +383,7 @@ void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, int dep
         m_polyline.reserve(int(points.size()));
         for (const GraphPoint &p : points) {
             if (std::isfinite(p.x()) && std::isfinite(p.y())) {
-                const QPointF pixel = toPixel(p.x(), p.y());
+                const QPointF pixel = map(p.x(), p.y());
                 m_polyline.append(QPointF(clampPixel(pixel.x()), clampPixel(pixel.y())));
             } else {
                 flush();
@@ -314,7 +393,7 @@ void LineGraphView::paintCurve(QPainter &painter, const GraphData &data, int dep
     }
     for (const std::shared_ptr<GraphData> &member : data.subData()) {
         if (member)
-            paintCurve(painter, *member, depth + 1);
+            paintCurve(painter, *member, width, map, depth + 1);
     }
 }
 
@@ -388,7 +467,15 @@ void LineGraphView::writeData(std::ostream &out) const
             xs[p.x()] = true;
             column.values.emplace(p.x(), p.y());
         }
-        columns.push_back(std::move(column));
+        // A curve drawn twice (in a layer and again on top) is written once.
+        const bool repeated = std::any_of(columns.begin(), columns.end(), [&column](const Column &c) {
+            return c.name == column.name && c.values.size() == column.values.size()
+                && std::equal(c.values.begin(), c.values.end(), column.values.begin(), [](const auto &a, const auto &b) {
+                       return a.first == b.first && (a.second == b.second || (std::isnan(a.second) && std::isnan(b.second)));
+                   });
+        });
+        if (!repeated)
+            columns.push_back(std::move(column));
     };
     std::function<void(const GraphData &, int)> walk = [&](const GraphData &group, int depth) {
         if (depth > MaxDepth)

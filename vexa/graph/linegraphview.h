@@ -4,13 +4,16 @@
 #include <vexa/graph/axis.h>
 #include <vexa/graph/graphdata.h>
 
+#include <QImage>
 #include <QPointF>
 #include <QPolygonF>
 #include <QRect>
 #include <QWidget>
 
 #include <iosfwd>
+#include <map>
 #include <memory>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -63,9 +66,24 @@ public:
     void showInfo(const std::string &text);
     const std::string &info() const { return m_info; }
 
-    // Pen width of the curves in pixels (1.5 by default).
+    // Pen width of the curves in pixels: 1 by default, which Qt draws fastest (a wider
+    // antialiased pen costs about twenty times as much per segment). A series can be given
+    // its own width (for itself and its members) until clear().
     void setCurveWidth(double width);
     double curveWidth() const { return m_curveWidth; }
+    void setCurveWidth(int series, double width);
+    double curveWidth(int series) const;
+
+    // Keeps the drawing of a series (with its members) in an image of the plot's size and
+    // draws that image again while the series is the same object (which must not change:
+    // a cached group gains no members), in the same plot rectangle, ranges and width. Worth it for a layer of many curves that
+    // stays while other series change (the active trials while another one is selected).
+    // Until clear(); the image itself outlives clear() so that the same object added again
+    // is not drawn anew.
+    void setSeriesCached(int series, bool cached = true);
+    bool isSeriesCached(int series) const { return m_cachedSeries.count(series) > 0; }
+    // How often a cached series was drawn anew (for tests and measurements).
+    int cachedSeriesRenderCount() const { return m_layerRenders; }
 
     // Calculates both axes' ranges from the series, as every paint does.
     void calculateRanges();
@@ -79,7 +97,8 @@ public:
     // The data as tab-separated text: a header line (the x axis' name, then one name per
     // curve), then one line per distinct x value in ascending order with each curve's y
     // value at that x (empty where a curve has none or it is not a number). Every series
-    // and every member of a group with points is a curve.
+    // and every member of a group with points is a curve; a curve with the name and the
+    // points of an earlier one is written once.
     void writeData(std::ostream &out) const;
     std::string dataText() const;
 
@@ -93,13 +112,37 @@ protected:
     // ticks and the grid and before the legend. Override to draw something with a curve.
     virtual void paintData(QPainter &painter, const std::shared_ptr<GraphData> &data, int index);
     // Draws one series' points in its colour and then its members.
-    void paintCurve(QPainter &painter, const GraphData &data);
+    void paintCurve(QPainter &painter, const GraphData &data, double width);
     // The column name of a curve in writeData(): its own name; a member without one takes
     // its group's name, numbered "(1)", "(2)" … when the group has several members.
     virtual std::string columnName(const GraphData &curve, const GraphData *group, int member, int members) const;
 
 private:
-    void paintCurve(QPainter &painter, const GraphData &data, int depth);
+    struct Mapping
+    {
+        double x0 = 0.0;
+        double xScale = 1.0;
+        double y0 = 0.0;
+        double yScale = 1.0;
+        QPointF operator()(double x, double y) const { return QPointF(x0 + x * xScale, y0 + y * yScale); }
+    };
+    Mapping mapping() const;
+    void paintCurve(QPainter &painter, const GraphData &data, double width, const Mapping &map, int depth);
+    void paintCachedCurve(QPainter &painter, const std::shared_ptr<GraphData> &data, double width);
+
+    // The drawing of one cached series and what it was drawn for.
+    struct Layer
+    {
+        std::weak_ptr<GraphData> data;
+        QRect rect;
+        double xMin = 0.0;
+        double xMax = 0.0;
+        double yMin = 0.0;
+        double yMax = 0.0;
+        double width = 0.0;
+        qreal pixelRatio = 1.0;
+        QImage image;
+    };
     void paintAxes(QPainter &painter);
     void paintLegend(QPainter &painter, const LegendLayout &legend);
     void paintNotes(QPainter &painter);
@@ -109,6 +152,10 @@ private:
     std::vector<std::shared_ptr<GraphData>> m_data;
     std::string m_info;
     QRect m_plotRect;
-    double m_curveWidth = 1.5;
+    double m_curveWidth = 1.0;
+    std::map<int, double> m_seriesWidths;
+    std::set<int> m_cachedSeries;
+    std::vector<Layer> m_layers;
+    int m_layerRenders = 0;
     QPolygonF m_polyline; // Reused by paintCurve.
 };

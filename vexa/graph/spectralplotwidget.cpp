@@ -18,6 +18,8 @@ namespace vexa {
 namespace {
 
 const QColor OtherTrialColor(90, 100, 130, 90);
+// The compared curves stand out; the many others keep the fast one-pixel pen.
+constexpr double EmphasisWidth = 2.0;
 constexpr int StandardIndex = 0;
 constexpr int SelectedTrialIndex = 1;
 
@@ -110,27 +112,39 @@ void SpectralPlotWidget::fillSelectedGeometry(const std::vector<SpectralEntry> &
     const QString geometry = selection ? selection->selectedColorGeometry().toString() : QString();
     const SpectralEntry *standard = nullptr;
     const SpectralEntry *selected = nullptr;
-    std::vector<const SpectralEntry *> others;
+    std::vector<const SpectralEntry *> active;
     QStringList missing;
     for (const SpectralEntry &entry : entries) {
         if (entry.role == SpectralEntry::Role::Standard)
             standard = &entry;
         else if (entry.role == SpectralEntry::Role::SelectedTrial)
             selected = &entry;
-        else
-            others.push_back(&entry);
+        if (entry.trial && selection->isActive(entry.trial))
+            active.push_back(&entry);
         if (!entry.spectrum)
             missing << entry.name;
     }
+    const size_t others = active.size() - (selected && selection->isActive(selected->trial) ? 1 : 0);
 
-    if (!others.empty()) {
-        auto group = std::make_shared<GraphDataGroup>(
-            tr("Other active trials (%1)").arg(others.size()).toStdString(), OtherTrialColor);
-        for (const SpectralEntry *entry : others) {
+    // The selected trial is part of the layer too, so that selecting another one keeps it.
+    std::vector<std::shared_ptr<ReflectanceSpectrum>> layerSpectra;
+    for (const SpectralEntry *entry : active)
+        layerSpectra.push_back(entry->spectrum);
+    if (layerSpectra.empty()) {
+        m_activeLayer.reset();
+    } else if (!m_activeLayer || layerSpectra != m_activeLayerSpectra) {
+        auto group = std::make_shared<GraphDataGroup>(tr("Active trials (%1)").arg(active.size()).toStdString(),
+                                                      OtherTrialColor);
+        for (const SpectralEntry *entry : active) {
             if (entry->spectrum)
                 group->addSubData(entryCurve(*entry, OtherTrialColor));
         }
-        m_view->addData(group);
+        m_activeLayer = group;
+    }
+    m_activeLayerSpectra = layerSpectra;
+    if (m_activeLayer && active.size() > 1) {
+        m_view->addData(m_activeLayer);
+        m_view->setSeriesCached(0);
     }
     for (const auto &[entry, index] : {std::make_pair(standard, StandardIndex), std::make_pair(selected, SelectedTrialIndex)}) {
         if (!entry)
@@ -139,6 +153,7 @@ void SpectralPlotWidget::fillSelectedGeometry(const std::vector<SpectralEntry> &
         if (entry->spectrum)
             group->addSubData(std::make_shared<SpectralGraphData>(entry->spectrum, index));
         m_view->addData(group);
+        m_view->setCurveWidth(int(m_view->data().size()) - 1, EmphasisWidth);
     }
 
     if (entries.empty()) {
@@ -155,8 +170,10 @@ void SpectralPlotWidget::fillSelectedGeometry(const std::vector<SpectralEntry> &
         title = tr("%1 at %2").arg(standard->name, geometry);
     else
         title = tr("Spectra at %1").arg(geometry);
-    if (!others.empty())
-        title += tr(", with %n other active trial(s)", nullptr, int(others.size()));
+    if (others == 1)
+        title += tr(", with one other active trial");
+    else if (others > 1)
+        title += tr(", with %1 other active trials").arg(others);
     m_title->setText(title);
     if (!missing.isEmpty())
         m_view->showInfo(tr("No spectrum at %1: %2").arg(geometry, joined(missing)).toStdString());
@@ -164,6 +181,8 @@ void SpectralPlotWidget::fillSelectedGeometry(const std::vector<SpectralEntry> &
 
 void SpectralPlotWidget::fillAllGeometries(const std::vector<SpectralEntry> &entries)
 {
+    m_activeLayer.reset();
+    m_activeLayerSpectra.clear();
     // Entries come per geometry, the standard's first.
     std::vector<std::pair<Geometry, std::vector<const SpectralEntry *>>> byGeometry;
     QString standardName;
@@ -187,6 +206,7 @@ void SpectralPlotWidget::fillAllGeometries(const std::vector<SpectralEntry> &ent
                 group->addSubData(entryCurve(*entry, entry->role == SpectralEntry::Role::Standard ? pale : color));
         }
         m_view->addData(group);
+        m_view->setCurveWidth(n, EmphasisWidth);
     }
 
     if (trialName.isEmpty() && standardName.isEmpty()) {

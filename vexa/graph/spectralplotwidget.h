@@ -1,22 +1,28 @@
 #pragma once
 
 #include <vexa/vexa_export.h>
+#include <vexa/graph/graphdata.h>
 #include <vexa/graph/spectralselection.h>
 #include <vexa/models/appearanceviewbase.h>
 
 #include <QWidget>
 
+#include <memory>
+#include <vector>
+
 class QLabel;
 
 namespace vexa {
 
+class ReflectanceSpectrum;
 class SpectralView;
 
 // The curve area of a spectral page with its title, following the page's models.
 //
-// At the selected geometry the first legend entry holds the active trials other than the
-// selected one (thin, pale), then come the standard (black) and the selected trial
-// (blue), drawn in that order so that the two compared curves lie on top. At all
+// At the selected geometry the first legend entry holds the active trials (thin, pale),
+// then come the standard (black) and the selected trial (blue), drawn in that order and
+// wider so that the two compared curves lie on top. The layer of active trials is drawn
+// once and kept while only the selected trial changes. At all
 // geometries each geometry is one legend entry in its own colour: the selected trial's
 // curve solid, the standard's pale. Missing spectra are named in the view's note.
 class VEXA_EXPORT SpectralPlotWidget : public QWidget, public AppearanceViewBase
@@ -57,6 +63,9 @@ private:
     void fillAllGeometries(const std::vector<SpectralEntry> &entries);
 
     SpectralScope m_scope = SpectralScope::SelectedGeometry;
+    // The layer of active trials and the spectra it was built from.
+    std::shared_ptr<GraphData> m_activeLayer;
+    std::vector<std::shared_ptr<ReflectanceSpectrum>> m_activeLayerSpectra;
     QLabel *m_title;      // Child.
     SpectralView *m_view; // Child.
 };

@@ -1,13 +1,13 @@
 #include <colorimetry/colorconverter.h>
 #include <colorimetry/colordifferencecalculator.h>
 #include <colorimetry/colorindicescalculator.h>
-#include <colorimetry/spectralweights.h>
+
+#include "metamers.h"
 
 #include <domain/reflectancespectrum.h>
 
 #include <QtTest>
 
-#include <array>
 #include <cmath>
 #include <limits>
 #include <stdexcept>
@@ -50,50 +50,6 @@ QVector<double> standardValues()
 ReflectanceSpectrum spectrum(const QVector<double> &values)
 {
     return ReflectanceSpectrum(values, 400, 10);
-}
-
-// Standard plus a metameric black under `condition`: a wave projected off the three
-// weighting vectors, so that X, Y and Z stay what they were.
-QVector<double> metamer(const QVector<double> &values, const ColorimetricCondition &condition)
-{
-    const auto weights = SpectralWeights::forGrid(condition.illuminant(), condition.observer(), 400, 10, 31);
-    const std::array<const std::vector<double> *, 3> w{&weights->weightsX(), &weights->weightsY(), &weights->weightsZ()};
-    std::vector<double> wave(31);
-    for (int i = 0; i < 31; ++i)
-        wave[size_t(i)] = 0.15 * std::sin(i * 0.75);
-    double g[3][3];
-    double c[3];
-    for (int r = 0; r < 3; ++r) {
-        c[r] = 0.0;
-        for (int i = 0; i < 31; ++i)
-            c[r] += (*w[size_t(r)])[size_t(i)] * wave[size_t(i)];
-        for (int k = 0; k < 3; ++k) {
-            g[r][k] = 0.0;
-            for (int i = 0; i < 31; ++i)
-                g[r][k] += (*w[size_t(r)])[size_t(i)] * (*w[size_t(k)])[size_t(i)];
-        }
-    }
-    auto det = [](double m[3][3]) {
-        return m[0][0] * (m[1][1] * m[2][2] - m[1][2] * m[2][1]) - m[0][1] * (m[1][0] * m[2][2] - m[1][2] * m[2][0])
-            + m[0][2] * (m[1][0] * m[2][1] - m[1][1] * m[2][0]);
-    };
-    const double d = det(g);
-    double a[3];
-    for (int k = 0; k < 3; ++k) { // Cramer's rule
-        double m[3][3];
-        for (int r = 0; r < 3; ++r)
-            for (int j = 0; j < 3; ++j)
-                m[r][j] = j == k ? c[r] : g[r][j];
-        a[k] = det(m) / d;
-    }
-    QVector<double> result = values;
-    for (int i = 0; i < 31; ++i) {
-        double black = wave[size_t(i)];
-        for (int k = 0; k < 3; ++k)
-            black -= a[k] * (*w[size_t(k)])[size_t(i)];
-        result[i] += black;
-    }
-    return result;
 }
 
 double deltaE(const ReflectanceSpectrum &s, const ReflectanceSpectrum &t, const ColorimetricCondition &c,
@@ -141,7 +97,7 @@ void tst_MetamerismIndex::metamericPairKeepsTheTestDifference()
 {
     QFETCH(QString, formula);
     const ReflectanceSpectrum s = spectrum(standardValues());
-    const QVector<double> metameric = metamer(standardValues(), D65);
+    const QVector<double> metameric = metamers::metamer(standardValues(), 400, 10, D65);
     for (double v : metameric)
         QVERIFY(v > 0.0);
     const ReflectanceSpectrum t = spectrum(metameric);

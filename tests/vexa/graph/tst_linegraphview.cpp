@@ -24,6 +24,8 @@ private Q_SLOTS:
     void plotRectangle_data();
     void plotRectangle();
     void curvePassesThroughMappedPixels();
+    void seriesWidths();
+    void cachedSeries();
     void legendOnlyFromTwoSeries_data();
     void legendOnlyFromTwoSeries();
     void xTicksSitOnWholeValues();
@@ -253,6 +255,89 @@ void tst_LineGraphView::curvePassesThroughMappedPixels()
     QVERIFY(!near(image, view.toPixel(75, 2.5), QColor(220, 0, 0), 150));
 }
 
+// One series drawn wider than the rest: 2.5 pixels beside its line is still its colour.
+void tst_LineGraphView::seriesWidths()
+{
+    LineGraphView view;
+    view.resize(420, 320);
+    view.setXAxis(Axis(0.0, 10.0));
+    view.setYAxis(Axis(0.0, 10.0));
+    const QColor red(220, 0, 0);
+    const QColor blue(0, 0, 220);
+    view.addData(series(line(0, 3, 10, 3), "thin", red));
+    view.addData(series(line(0, 7, 10, 7), "wide", blue));
+    QCOMPARE(view.curveWidth(), 1.0);
+    view.setCurveWidth(2.0);
+    view.setCurveWidth(1, 8.0);
+    view.setCurveWidth(0, -1.0); // refused
+    view.setCurveWidth(std::numeric_limits<double>::quiet_NaN());
+    QCOMPARE(view.curveWidth(0), 2.0);
+    QCOMPARE(view.curveWidth(1), 8.0);
+    const QImage image = render(view);
+    const QPointF thin = view.toPixel(5, 3);
+    const QPointF wide = view.toPixel(5, 7);
+    QVERIFY(near(image, thin, red));
+    QVERIFY(near(image, wide, blue));
+    QVERIFY(!near(image, thin + QPointF(0, 3.5), red, 150));
+    QVERIFY(near(image, wide + QPointF(0, 2.5), blue));
+    view.clear();
+    QCOMPARE(view.curveWidth(1), 2.0);
+}
+
+// A cached layer looks like the drawn series and is drawn anew only when what it shows changes.
+void tst_LineGraphView::cachedSeries()
+{
+    auto layer = std::make_shared<GraphDataGroup>("layer", Qt::gray);
+    for (int i = 0; i < 20; ++i)
+        layer->addSubData(series(line(0, i * 0.4, 10, 10 - i * 0.3), "", QColor(90, 100, 130, 90)));
+    auto top = series(line(0, 5, 10, 5), "top", Qt::red);
+    LineGraphView plain;
+    LineGraphView cached;
+    for (LineGraphView *view : {&plain, &cached}) {
+        view->resize(400, 300);
+        view->addData(layer);
+        view->addData(top);
+    }
+    cached.setSeriesCached(0);
+    QVERIFY(cached.isSeriesCached(0) && !cached.isSeriesCached(1));
+    const QImage expected = render(plain);
+    QImage image = render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 1);
+    int differing = 0;
+    for (int y = 0; y < image.height(); ++y)
+        for (int x = 0; x < image.width(); ++x)
+            differing += image.pixel(x, y) != expected.pixel(x, y);
+    QVERIFY2(differing < image.width() * image.height() / 200, qPrintable(QString::number(differing)));
+
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 1);
+    // The same object again after clear(): still the same drawing.
+    cached.clear();
+    cached.addData(layer);
+    cached.addData(top);
+    cached.setSeriesCached(0);
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 1);
+    // Another size, other ranges, another width, another object: drawn anew.
+    cached.resize(420, 300);
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 2);
+    cached.setYAxis(Axis(0.0, 20.0));
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 3);
+    cached.setCurveWidth(0, 2.0);
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 4);
+    cached.clear();
+    cached.addData(series(line(0, 0, 10, 10)));
+    cached.setSeriesCached(0);
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 5);
+    cached.setSeriesCached(0, false);
+    render(cached);
+    QCOMPARE(cached.cachedSeriesRenderCount(), 5);
+}
+
 void tst_LineGraphView::legendOnlyFromTwoSeries_data()
 {
     QTest::addColumn<int>("seriesCount");
@@ -327,6 +412,7 @@ void tst_LineGraphView::badDataIsDrawnAsFarAsMeaningful()
     QFETCH(QString, kind);
     LineGraphView view;
     view.resize(kind == "tiny" ? QSize(30, 20) : QSize(400, 300));
+    view.setCurveWidth(3.0);
     view.setXAxis(Axis(0.0, 10.0));
     view.setYAxis(Axis(0.0, 10.0));
     const QColor red(220, 0, 0);
@@ -377,6 +463,7 @@ void tst_LineGraphView::textForm()
     group->addSubData(series({GraphPoint(410, 0.5)}, ""));
     group->addSubData(series({GraphPoint(NaN, 0.9)}, "named"));
     view.addData(group);
+    view.addData(series({GraphPoint(400, 0.125), GraphPoint(410, 0.2)}, "A")); // A again: written once
     QCOMPARE(QString::fromStdString(view.dataText()), QStringLiteral("nm\tA\tG (1)\tG (2)\tnamed\n"
                                                                       "400\t0.125\t0.3\t\t\n"
                                                                       "410\t0.2\t\t0.5\t\n"

@@ -75,10 +75,13 @@ void tst_SpectralPlotWidget::selectedGeometry()
     SpectralPlotWidget widget;
     widget.setModels(m_data, m_selection);
     const SpectralView *view = widget.view();
-    // Other active trials first (drawn under), then the standard and the selected trial.
-    QCOMPARE(names(view), QStringList({"Other active trials (2)", "STD", "T1"}));
-    QCOMPARE(group(view, 0)->subData().size(), size_t(2));
+    // The active trials first (pale, drawn under), then the standard and the selected trial.
+    QCOMPARE(names(view), QStringList({"Active trials (3)", "STD", "T1"}));
+    QCOMPARE(group(view, 0)->subData().size(), size_t(3));
     QVERIFY(group(view, 0)->subData()[0]->color().alpha() < 255);
+    QVERIFY(view->isSeriesCached(0));
+    QCOMPARE(view->curveWidth(0), 1.0);
+    QVERIFY(view->curveWidth(1) > 1.0 && view->curveWidth(2) > 1.0);
     const auto standard = std::dynamic_pointer_cast<SpectralGraphData>(group(view, 1)->subData().front());
     const auto selected = std::dynamic_pointer_cast<SpectralGraphData>(group(view, 2)->subData().front());
     QVERIFY(standard && selected);
@@ -86,21 +89,32 @@ void tst_SpectralPlotWidget::selectedGeometry()
     QCOMPARE(selected->colorIndex(), 1);
     QCOMPARE(group(view, 1)->color(), standard->color());
     QCOMPARE(selected->spectrum(), m_trials[0]->appearanceValues()->reflectanceAt(Geometry("45as45")));
-    QVERIFY(widget.titleLabel()->text().contains(QStringLiteral("T1 against STD at 45as45")));
+    QCOMPARE(widget.titleLabel()->text(), QStringLiteral("T1 against STD at 45as45, with 2 other active trials"));
     QVERIFY(view->info().empty());
 
-    // The copied text names each curve by measurement and geometry.
+    // The copied text names each curve by measurement and geometry, once.
     const QString text = view->copyText();
-    QVERIFY(text.startsWith(QStringLiteral("nm\tT2 45as45\tT3 45as45\tSTD 45as45\tT1 45as45\n")));
+    QVERIFY(text.startsWith(QStringLiteral("nm\tT1 45as45\tT2 45as45\tT3 45as45\tSTD 45as45\n")));
 }
 
 void tst_SpectralPlotWidget::followsTheSelection()
 {
     SpectralPlotWidget widget;
+    widget.resize(600, 400);
     widget.setModels(m_data, m_selection);
+    widget.grab();
+    const auto layer = widget.view()->data().front();
+    QCOMPARE(widget.view()->cachedSeriesRenderCount(), 1);
     m_selection->setSelectedTrial(m_trials[1]);
-    QCOMPARE(names(widget.view()), QStringList({"Other active trials (2)", "STD", "T2"}));
+    QCOMPARE(names(widget.view()), QStringList({"Active trials (3)", "STD", "T2"}));
+    // Selecting another trial keeps the layer of active trials, drawn once.
+    QCOMPARE(widget.view()->data().front(), layer);
+    widget.grab();
+    QCOMPARE(widget.view()->cachedSeriesRenderCount(), 1);
     m_selection->setSelectedColorGeometry(Geometry("45as15"));
+    QVERIFY(widget.view()->data().front() != layer);
+    widget.grab();
+    QCOMPARE(widget.view()->cachedSeriesRenderCount(), 2);
     const auto selected = std::dynamic_pointer_cast<SpectralGraphData>(group(widget.view(), 2)->subData().front());
     QCOMPARE(selected->spectrum(), m_trials[1]->appearanceValues()->reflectanceAt(Geometry("45as15")));
     // Only the selected trial active: no group of others.
@@ -117,7 +131,7 @@ void tst_SpectralPlotWidget::missingSpectraAreNamed()
     widget.setModels(m_data, m_selection);
     m_selection->setSelectedColorGeometry(Geometry("45as110"));
     QCOMPARE(QString::fromStdString(widget.view()->info()), QStringLiteral("No spectrum at 45as110: T3"));
-    QCOMPARE(group(widget.view(), 0)->subData().size(), size_t(1)); // T2 only
+    QCOMPARE(group(widget.view(), 0)->subData().size(), size_t(2)); // T1 and T2
 }
 
 void tst_SpectralPlotWidget::allGeometries()
