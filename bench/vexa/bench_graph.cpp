@@ -3,7 +3,9 @@
 // drawn by QPainter::drawPolyline with the same pen into the same image. Selection: a page
 // of 1,000 active trials at six geometries; one step selects the next trial and paints the
 // spectral plot, the spectral value table and the metamerism readout, beside the raw
-// reference of painting the same 1,001 curves of 31 points.
+// reference of painting the same curves of 31 points (the active trials' layer, which the
+// plot keeps while only the selection changes). The parts of a step and a change of
+// geometry (every curve drawn anew) are measured too.
 //
 // Run: build/bench/vexa/bench_graph (offscreen by default). One 60 Hz frame is 16.7 ms.
 
@@ -188,6 +190,45 @@ void BM_PaintCurves1000RawQPainter(benchmark::State &state)
     state.counters["curves"] = double(curves.size());
 }
 
+// The parts of a selection step.
+void BM_SelectTrialOnly1000(benchmark::State &state)
+{
+    Page &p = page();
+    size_t next = 1;
+    for (auto _ : state) {
+        p.selection->setSelectedTrial(p.trials[next]);
+        next = (next + 7) % p.trials.size();
+    }
+}
+
+template <typename Widget> void paintOne(benchmark::State &state, Widget Page::*widget)
+{
+    Page &p = page();
+    QWidget &w = p.*widget;
+    QImage image(w.size(), QImage::Format_ARGB32_Premultiplied);
+    for (auto _ : state) {
+        w.render(&image);
+        benchmark::DoNotOptimize(image.constBits());
+    }
+}
+
+// Another geometry: every curve and the table are built and drawn anew.
+void BM_SelectGeometryAndPaint1000(benchmark::State &state)
+{
+    Page &p = page();
+    QImage plotImage(p.plot.size(), QImage::Format_ARGB32_Premultiplied);
+    QImage tableImage(p.table.size(), QImage::Format_ARGB32_Premultiplied);
+    const Geometry geometries[] = {Geometry("45as15"), Geometry("45as45")};
+    int next = 0;
+    for (auto _ : state) {
+        p.selection->setSelectedColorGeometry(geometries[next]);
+        next = 1 - next;
+        p.plot.render(&plotImage);
+        p.table.render(&tableImage);
+        benchmark::DoNotOptimize(plotImage.constBits());
+    }
+}
+
 } // namespace
 
 // The argument is the curves' pen width in tenths of a pixel.
@@ -195,6 +236,11 @@ BENCHMARK(BM_PaintSpectra)->Arg(10)->Arg(15)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_PaintSpectraRawQPainter)->Arg(10)->Arg(15)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_SelectTrialAndPaint1000)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_PaintCurves1000RawQPainter)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_SelectTrialOnly1000)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(paintOne, PlotCached1000, &Page::plot)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(paintOne, Table1000, &Page::table)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(paintOne, Metamerism, &Page::metamerism)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_SelectGeometryAndPaint1000)->Unit(benchmark::kMillisecond);
 
 int main(int argc, char **argv)
 {

@@ -8,10 +8,14 @@
 #include <vexa/models/trialselectionmodel.h>
 
 #include <domain/reflectancespectrum.h>
+#include <domain/standard.h>
+#include <domain/trial.h>
 
 #include <QEvent>
 #include <QLabel>
 #include <QVBoxLayout>
+
+#include <optional>
 
 namespace vexa {
 
@@ -98,91 +102,109 @@ void SpectralPlotWidget::changeEvent(QEvent *event)
 
 void SpectralPlotWidget::refreshAll()
 {
-    m_view->clear();
-    const auto entries = SpectralSelection::entries(appearanceViewDataModel(), trialSelectionModel(), m_scope);
-    if (m_scope == SpectralScope::SelectedGeometry)
-        fillSelectedGeometry(entries);
-    else
-        fillAllGeometries(entries);
+    m_layerValid = false;
+    refresh();
 }
 
-void SpectralPlotWidget::fillSelectedGeometry(const std::vector<SpectralEntry> &entries)
+void SpectralPlotWidget::refresh()
 {
+    m_view->clear();
+    if (m_scope == SpectralScope::SelectedGeometry)
+        fillSelectedGeometry();
+    else
+        fillAllGeometries(SpectralSelection::entries(appearanceViewDataModel(), trialSelectionModel(), m_scope));
+}
+
+void SpectralPlotWidget::fillSelectedGeometry()
+{
+    const auto data = appearanceViewDataModel();
     const auto selection = trialSelectionModel();
-    const QString geometry = selection ? selection->selectedColorGeometry().toString() : QString();
-    const SpectralEntry *standard = nullptr;
-    const SpectralEntry *selected = nullptr;
-    std::vector<const SpectralEntry *> active;
-    QStringList missing;
-    for (const SpectralEntry &entry : entries) {
-        if (entry.role == SpectralEntry::Role::Standard)
-            standard = &entry;
-        else if (entry.role == SpectralEntry::Role::SelectedTrial)
-            selected = &entry;
-        if (entry.trial && selection->isActive(entry.trial))
-            active.push_back(&entry);
-        if (!entry.spectrum)
-            missing << entry.name;
-    }
-    const size_t others = active.size() - (selected && selection->isActive(selected->trial) ? 1 : 0);
-
-    // The selected trial is part of the layer too, so that selecting another one keeps it.
-    std::vector<std::shared_ptr<ReflectanceSpectrum>> layerSpectra;
-    for (const SpectralEntry *entry : active)
-        layerSpectra.push_back(entry->spectrum);
-    if (layerSpectra.empty()) {
-        m_activeLayer.reset();
-    } else if (!m_activeLayer || layerSpectra != m_activeLayerSpectra) {
-        auto group = std::make_shared<GraphDataGroup>(tr("Active trials (%1)").arg(active.size()).toStdString(),
-                                                      OtherTrialColor);
-        for (const SpectralEntry *entry : active) {
-            if (entry->spectrum)
-                group->addSubData(entryCurve(*entry, OtherTrialColor));
-        }
-        m_activeLayer = group;
-    }
-    m_activeLayerSpectra = layerSpectra;
-    if (m_activeLayer && active.size() > 1) {
-        m_view->addData(m_activeLayer);
-        m_view->setSeriesCached(0);
-    }
-    for (const auto &[entry, index] : {std::make_pair(standard, StandardIndex), std::make_pair(selected, SelectedTrialIndex)}) {
-        if (!entry)
-            continue;
-        auto group = std::make_shared<GraphDataGroup>(entry->name.toStdString(), SpectralGraphData::colorForIndex(index));
-        if (entry->spectrum)
-            group->addSubData(std::make_shared<SpectralGraphData>(entry->spectrum, index));
-        m_view->addData(group);
-        m_view->setCurveWidth(int(m_view->data().size()) - 1, EmphasisWidth);
-    }
-
-    if (entries.empty()) {
+    if (!data || !selection || (!data->standard() && !selection->selectedTrial() && selection->activeTrials().empty())) {
+        m_layerValid = false;
         m_title->setText(tr("Spectra"));
         m_view->showInfo(tr("No standard and no trial to show").toStdString());
         return;
     }
+    const Geometry geometry = selection->selectedColorGeometry();
+    const std::vector<std::shared_ptr<Trial>> &activeTrials = selection->activeTrials();
+
+    // The layer holds every active trial, the selected one too, so that selecting another
+    // trial keeps it (and its drawing).
+    if (!m_layerValid || m_layerTrials != activeTrials || m_layerGeometry != geometry) {
+        m_activeLayer.reset();
+        m_layerMissing.clear();
+        auto group = std::make_shared<GraphDataGroup>(tr("Active trials (%1)").arg(activeTrials.size()).toStdString(),
+                                                      OtherTrialColor);
+        for (const std::shared_ptr<Trial> &trial : activeTrials) {
+            if (!trial)
+                continue;
+            const SpectralEntry entry =
+                SpectralSelection::trialEntry(*data, trial, geometry, SpectralEntry::Role::ActiveTrial);
+            if (entry.spectrum)
+                group->addSubData(entryCurve(entry, OtherTrialColor));
+            else
+                m_layerMissing << entry.name;
+        }
+        if (activeTrials.size() > 1)
+            m_activeLayer = group;
+        m_layerTrials = activeTrials;
+        m_layerGeometry = geometry;
+        m_layerValid = true;
+    }
+    if (m_activeLayer) {
+        m_view->addData(m_activeLayer);
+        m_view->setSeriesCached(0);
+    }
+
+    std::optional<SpectralEntry> standard;
+    std::optional<SpectralEntry> selected;
+    if (data->standard())
+        standard = SpectralSelection::standardEntry(*data, geometry);
+    const std::shared_ptr<Trial> &selectedTrial = selection->selectedTrial();
+    const bool selectedActive = selectedTrial && selection->isActive(selectedTrial);
+    if (selectedTrial)
+        selected = SpectralSelection::trialEntry(*data, selectedTrial, geometry, SpectralEntry::Role::SelectedTrial);
+    for (auto [entry, index] : {std::make_pair(&standard, StandardIndex), std::make_pair(&selected, SelectedTrialIndex)}) {
+        if (!*entry)
+            continue;
+        auto group = std::make_shared<GraphDataGroup>((*entry)->name.toStdString(), SpectralGraphData::colorForIndex(index));
+        if ((*entry)->spectrum)
+            group->addSubData(std::make_shared<SpectralGraphData>((*entry)->spectrum, index));
+        m_view->addData(group);
+        m_view->setCurveWidth(int(m_view->data().size()) - 1, EmphasisWidth);
+    }
+
+    const QString geometryName = geometry.toString();
     QString title;
     if (standard && selected)
-        title = tr("%1 against %2 at %3").arg(selected->name, standard->name, geometry);
+        title = tr("%1 against %2 at %3").arg(selected->name, standard->name, geometryName);
     else if (selected)
-        title = tr("%1 at %2").arg(selected->name, geometry);
+        title = tr("%1 at %2").arg(selected->name, geometryName);
     else if (standard)
-        title = tr("%1 at %2").arg(standard->name, geometry);
+        title = tr("%1 at %2").arg(standard->name, geometryName);
     else
-        title = tr("Spectra at %1").arg(geometry);
+        title = tr("Spectra at %1").arg(geometryName);
+    const size_t others = activeTrials.size() - (selectedActive ? 1 : 0);
     if (others == 1)
         title += tr(", with one other active trial");
     else if (others > 1)
         title += tr(", with %1 other active trials").arg(others);
     m_title->setText(title);
+
+    QStringList missing;
+    if (standard && !standard->spectrum)
+        missing << standard->name;
+    missing << m_layerMissing;
+    if (selected && !selected->spectrum && !selectedActive)
+        missing << selected->name;
     if (!missing.isEmpty())
-        m_view->showInfo(tr("No spectrum at %1: %2").arg(geometry, joined(missing)).toStdString());
+        m_view->showInfo(tr("No spectrum at %1: %2").arg(geometryName, joined(missing)).toStdString());
 }
 
 void SpectralPlotWidget::fillAllGeometries(const std::vector<SpectralEntry> &entries)
 {
+    m_layerValid = false;
     m_activeLayer.reset();
-    m_activeLayerSpectra.clear();
     // Entries come per geometry, the standard's first.
     std::vector<std::pair<Geometry, std::vector<const SpectralEntry *>>> byGeometry;
     QString standardName;

@@ -5,6 +5,7 @@
 #include <vexa/graph/spectralselection.h>
 #include <vexa/models/appearanceviewbase.h>
 
+#include <QStringList>
 #include <QWidget>
 
 #include <memory>
@@ -14,8 +15,8 @@ class QLabel;
 
 namespace vexa {
 
-class ReflectanceSpectrum;
 class SpectralView;
+class Trial;
 
 // The curve area of a spectral page with its title, following the page's models.
 //
@@ -53,19 +54,25 @@ protected:
     void refreshQCJob() override { refreshAll(); }
     void refreshActiveTrials() override { refreshAll(); }
     void refreshTrials() override { refreshAll(); }
-    void onTrialSelected() override { refreshAll(); }
+    // Keeps the layer of active trials when they and the geometry are the same.
+    void onTrialSelected() override { refresh(); }
     void onActiveGeometriesChanged() override { refreshAll(); }
-    void onGeometrySelected() override { refreshAll(); }
+    void onGeometrySelected() override { refresh(); }
     void changeEvent(QEvent *event) override;
 
 private:
-    void fillSelectedGeometry(const std::vector<SpectralEntry> &entries);
+    void refresh();
+    void fillSelectedGeometry();
     void fillAllGeometries(const std::vector<SpectralEntry> &entries);
 
     SpectralScope m_scope = SpectralScope::SelectedGeometry;
-    // The layer of active trials and the spectra it was built from.
+    // The layer of active trials, what it was built for, and the active trials without a
+    // spectrum there.
+    bool m_layerValid = false;
     std::shared_ptr<GraphData> m_activeLayer;
-    std::vector<std::shared_ptr<ReflectanceSpectrum>> m_activeLayerSpectra;
+    std::vector<std::shared_ptr<Trial>> m_layerTrials;
+    Geometry m_layerGeometry;
+    QStringList m_layerMissing;
     QLabel *m_title;      // Child.
     SpectralView *m_view; // Child.
 };

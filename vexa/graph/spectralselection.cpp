@@ -32,6 +32,30 @@ void addGeometries(const std::shared_ptr<AppearanceValues> &values, std::set<Geo
 
 } // namespace
 
+SpectralEntry SpectralSelection::standardEntry(const AppearanceViewDataModel &dataModel, const Geometry &geometry)
+{
+    SpectralEntry entry;
+    entry.role = SpectralEntry::Role::Standard;
+    entry.name = dataModel.standard()->name();
+    entry.geometry = geometry;
+    entry.spectrum = spectrumAt(dataModel.standard()->appearanceValues(), geometry);
+    return entry;
+}
+
+SpectralEntry SpectralSelection::trialEntry(const AppearanceViewDataModel &dataModel, const std::shared_ptr<Trial> &trial,
+                                            const Geometry &geometry, SpectralEntry::Role role)
+{
+    SpectralEntry entry;
+    entry.role = role;
+    entry.name = UIHelper::trialDisplayString(*trial, QString::fromStdString(dataModel.nameFormat()));
+    entry.geometry = geometry;
+    entry.trial = trial;
+    entry.spectrum = spectrumAt(trial->appearanceValues(), geometry);
+    if (const std::shared_ptr<Standard> &standard = dataModel.standard())
+        entry.reference = spectrumAt(standard->appearanceValues(), geometry);
+    return entry;
+}
+
 std::vector<SpectralEntry> SpectralSelection::entries(const std::shared_ptr<AppearanceViewDataModel> &dataModel,
                                                       const std::shared_ptr<TrialSelectionModel> &selectionModel,
                                                       SpectralScope scope)
@@ -40,56 +64,40 @@ std::vector<SpectralEntry> SpectralSelection::entries(const std::shared_ptr<Appe
     if (!dataModel || !selectionModel)
         return result;
     const std::shared_ptr<Standard> &standard = dataModel->standard();
-    const std::shared_ptr<AppearanceValues> standardValues = standard ? standard->appearanceValues() : nullptr;
-    const QString format = QString::fromStdString(dataModel->nameFormat());
     const std::shared_ptr<Trial> &selected = selectionModel->selectedTrial();
-
-    auto standardEntry = [&](const Geometry &geometry) {
-        SpectralEntry entry;
-        entry.role = SpectralEntry::Role::Standard;
-        entry.name = standard->name();
-        entry.geometry = geometry;
-        entry.spectrum = spectrumAt(standardValues, geometry);
-        result.push_back(entry);
-    };
-    auto trialEntry = [&](const std::shared_ptr<Trial> &trial, const Geometry &geometry) {
-        SpectralEntry entry;
-        entry.role = trial == selected ? SpectralEntry::Role::SelectedTrial : SpectralEntry::Role::ActiveTrial;
-        entry.name = UIHelper::trialDisplayString(*trial, format);
-        entry.geometry = geometry;
-        entry.trial = trial;
-        entry.spectrum = spectrumAt(trial->appearanceValues(), geometry);
-        entry.reference = spectrumAt(standardValues, geometry);
-        result.push_back(entry);
+    auto trialEntryOf = [&](const std::shared_ptr<Trial> &trial, const Geometry &geometry) {
+        result.push_back(trialEntry(*dataModel, trial, geometry,
+                                    trial == selected ? SpectralEntry::Role::SelectedTrial
+                                                      : SpectralEntry::Role::ActiveTrial));
     };
 
     if (scope == SpectralScope::SelectedGeometry) {
         const Geometry geometry = selectionModel->selectedColorGeometry();
         if (standard)
-            standardEntry(geometry);
+            result.push_back(standardEntry(*dataModel, geometry));
         bool selectedShown = false;
         for (const std::shared_ptr<Trial> &trial : selectionModel->activeTrials()) {
             if (!trial)
                 continue;
             selectedShown = selectedShown || trial == selected;
-            trialEntry(trial, geometry);
+            trialEntryOf(trial, geometry);
         }
         if (selected && !selectedShown)
-            trialEntry(selected, geometry);
+            trialEntryOf(selected, geometry);
         return result;
     }
 
     std::set<Geometry> geometries = selectionModel->colorGeometryFilter();
     if (geometries.empty()) {
-        addGeometries(standardValues, geometries);
+        addGeometries(standard ? standard->appearanceValues() : nullptr, geometries);
         if (selected)
             addGeometries(selected->appearanceValues(), geometries);
     }
     for (const Geometry &geometry : geometries) {
         if (standard)
-            standardEntry(geometry);
+            result.push_back(standardEntry(*dataModel, geometry));
         if (selected)
-            trialEntry(selected, geometry);
+            trialEntryOf(selected, geometry);
     }
     return result;
 }

@@ -58,6 +58,12 @@ public:
     static std::vector<SpectralEntry> entries(const std::shared_ptr<AppearanceViewDataModel> &dataModel,
                                               const std::shared_ptr<TrialSelectionModel> &selectionModel,
                                               SpectralScope scope);
+
+    // The entry of the data model's standard (which must be set) at a geometry.
+    static SpectralEntry standardEntry(const AppearanceViewDataModel &dataModel, const Geometry &geometry);
+    // The entry of a trial (not null) at a geometry, with the standard's spectrum as reference.
+    static SpectralEntry trialEntry(const AppearanceViewDataModel &dataModel, const std::shared_ptr<Trial> &trial,
+                                    const Geometry &geometry, SpectralEntry::Role role);
 };
 
 } // namespace vexa

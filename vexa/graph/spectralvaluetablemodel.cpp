@@ -1,6 +1,7 @@
 #include <vexa/graph/spectralvaluetablemodel.h>
 
 #include <vexa/graph/spectralgraphdata.h>
+#include <vexa/models/trialselectionmodel.h>
 #include <vexa/widgets/qttablemodelhelper.h>
 
 #include <domain/reflectancespectrum.h>
@@ -131,18 +132,21 @@ void SpectralValueTableModel::rebuild()
 // rebuilds the table.
 void SpectralValueTableModel::onTrialSelected()
 {
-    std::vector<SpectralEntry> entries =
-        SpectralSelection::entries(appearanceViewDataModel(), trialSelectionModel(), m_scope);
-    const bool sameColumns = std::equal(entries.begin(), entries.end(), m_entries.begin(), m_entries.end(),
-                                        [](const SpectralEntry &a, const SpectralEntry &b) {
-                                            return a.trial == b.trial && a.geometry == b.geometry
-                                                && a.spectrum == b.spectrum && a.reference == b.reference;
-                                        });
-    if (!sameColumns) {
+    const auto selection = trialSelectionModel();
+    const std::shared_ptr<Trial> selected = selection ? selection->selectedTrial() : nullptr;
+    // The columns stay when they are the active trials' before and after: neither the old
+    // nor the new selected trial is an inactive one shown behind them.
+    const bool inactiveShown = !m_entries.empty() && m_entries.back().trial && selection
+        && !selection->isActive(m_entries.back().trial);
+    if (m_scope != SpectralScope::SelectedGeometry || !selection || inactiveShown
+        || (selected && !selection->isActive(selected))) {
         refreshAll();
         return;
     }
-    m_entries = std::move(entries);
+    for (SpectralEntry &entry : m_entries) {
+        if (entry.trial)
+            entry.role = entry.trial == selected ? SpectralEntry::Role::SelectedTrial : SpectralEntry::Role::ActiveTrial;
+    }
     if (rowCount() > 0 && columnCount() > 1)
         Q_EMIT dataChanged(index(0, 1), index(rowCount() - 1, columnCount() - 1), {Qt::FontRole, Qt::BackgroundRole});
     if (columnCount() > 1)
