@@ -1,4 +1,4 @@
-#include "fixtures.h"
+#include "graphfixtures.h"
 
 #include <vexa/graph/metamerismview.h>
 #include <vexa/models/appearanceviewdatamodel.h>
@@ -32,10 +32,7 @@ private Q_SLOTS:
     void withoutSelection();
 
 private:
-    std::shared_ptr<AppearanceViewDataModel> m_data;
-    std::shared_ptr<TrialSelectionModel> m_selection;
-    std::shared_ptr<Standard> m_standard;
-    std::vector<std::shared_ptr<Trial>> m_trials;
+    graphfixtures::Page m_page;
 };
 
 namespace {
@@ -60,14 +57,8 @@ QStringList rows(const QTableWidget *table)
 
 void tst_MetamerismView::init()
 {
-    m_data = std::make_shared<AppearanceViewDataModel>(ColorimetricCondition(QStringLiteral("D65"), QStringLiteral("10")));
-    m_selection = std::make_shared<TrialSelectionModel>();
-    m_standard = fixtures::standard(QStringLiteral("STD"), 0.20);
-    m_trials = {fixtures::trial(QStringLiteral("T1"), 0.22, fixtures::threeAngles(), 575),
-                fixtures::trial(QStringLiteral("T2"), 0.18, {QStringLiteral("45as45")})};
-    m_data->setStandard(m_standard);
-    m_data->setTrials(m_trials);
-    m_selection->setActiveTrials(m_trials);
+    m_page.reset({fixtures::trial(QStringLiteral("T1"), 0.22, fixtures::threeAngles(), 575),
+                  fixtures::trial(QStringLiteral("T2"), 0.18, {QStringLiteral("45as45")})});
 }
 
 void tst_MetamerismView::columnsPerCondition_data()
@@ -89,9 +80,9 @@ void tst_MetamerismView::columnsPerCondition()
     QFETCH(QString, page);
     QFETCH(QStringList, tests);
     QFETCH(QStringList, headers);
-    m_data->setColorimetricCondition(ColorimetricCondition::fromString(page));
+    m_page.data->setColorimetricCondition(ColorimetricCondition::fromString(page));
     MetamerismView view;
-    view.setModels(m_data, m_selection);
+    view.setModels(m_page.data, m_page.selection);
     view.setTestIlluminants(tests);
     QCOMPARE(::headers(view.table()), headers);
     QCOMPARE(view.table()->rowCount(), 3);
@@ -100,14 +91,14 @@ void tst_MetamerismView::columnsPerCondition()
 void tst_MetamerismView::valuesPerGeometry()
 {
     MetamerismView view;
-    view.setModels(m_data, m_selection);
+    view.setModels(m_page.data, m_page.selection);
     QCOMPARE(rows(view.table()), QStringList({"45as15", "45as45", "45as110"}));
     const QVector<ColorimetricCondition> conditions = view.conditions();
     QCOMPARE(conditions.size(), 3);
     for (int r = 0; r < 3; ++r) {
         const Geometry g(view.table()->verticalHeaderItem(r)->text());
-        const auto s = m_standard->appearanceValues()->reflectanceAt(g);
-        const auto t = m_trials[0]->appearanceValues()->reflectanceAt(g);
+        const auto s = m_page.standard->appearanceValues()->reflectanceAt(g);
+        const auto t = m_page.trials[0]->appearanceValues()->reflectanceAt(g);
         for (int c = 0; c < 3; ++c) {
             const double dE = ColorDifferenceCalculator::Default_DE(QStringLiteral("CIE2000"),
                                                                     ColorConverter::toLab(*s, conditions[c]),
@@ -131,14 +122,14 @@ void tst_MetamerismView::valuesPerGeometry()
 void tst_MetamerismView::followsSelectionAndFilter()
 {
     MetamerismView view;
-    view.setModels(m_data, m_selection);
-    m_selection->setSelectedTrial(m_trials[1]);
+    view.setModels(m_page.data, m_page.selection);
+    m_page.selection->setSelectedTrial(m_page.trials[1]);
     QCOMPARE(rows(view.table()), QStringList({"45as45"}));
-    m_selection->setSelectedTrial(m_trials[0]);
-    m_selection->setColorGeometryFilter({Geometry("45as15"), Geometry("45as110")});
+    m_page.selection->setSelectedTrial(m_page.trials[0]);
+    m_page.selection->setColorGeometryFilter({Geometry("45as15"), Geometry("45as110")});
     QCOMPARE(rows(view.table()), QStringList({"45as15", "45as110"}));
     const double before = view.valueAt(0, 0);
-    m_data->setColorimetricCondition(ColorimetricCondition(QStringLiteral("D50"), QStringLiteral("2")));
+    m_page.data->setColorimetricCondition(ColorimetricCondition(QStringLiteral("D50"), QStringLiteral("2")));
     QCOMPARE(view.table()->horizontalHeaderItem(0)->text(), QStringLiteral("ΔE D50/2"));
     QVERIFY(view.valueAt(0, 0) != before);
 }
@@ -146,7 +137,7 @@ void tst_MetamerismView::followsSelectionAndFilter()
 void tst_MetamerismView::formula()
 {
     MetamerismView view;
-    view.setModels(m_data, m_selection);
+    view.setModels(m_page.data, m_page.selection);
     const double de2000 = view.valueAt(1, 0);
     QVERIFY(view.setDeltaEFormula(QStringLiteral("CIELab")));
     QCOMPARE(view.deltaEFormula(), QStringLiteral("CIELab"));
@@ -159,13 +150,13 @@ void tst_MetamerismView::withoutSelection()
 {
     MetamerismView view;
     QCOMPARE(view.table()->rowCount(), 0);
-    view.setModels(m_data, m_selection);
-    m_selection->setActiveTrials({});
+    view.setModels(m_page.data, m_page.selection);
+    m_page.selection->setActiveTrials({});
     QCOMPARE(view.table()->rowCount(), 0);
     QCOMPARE(view.titleLabel()->text(), QStringLiteral("Metamerism: select a trial"));
     QVERIFY(std::isnan(view.valueAt(0, 0)));
-    m_selection->setSelectedTrial(m_trials[0]);
-    m_data->setStandard(nullptr);
+    m_page.selection->setSelectedTrial(m_page.trials[0]);
+    m_page.data->setStandard(nullptr);
     QCOMPARE(view.table()->rowCount(), 0);
     QCOMPARE(view.titleLabel()->text(), QStringLiteral("Metamerism: no standard"));
 }

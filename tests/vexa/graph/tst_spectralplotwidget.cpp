@@ -1,4 +1,4 @@
-#include "fixtures.h"
+#include "graphfixtures.h"
 
 #include <vexa/graph/graphdatagroup.h>
 #include <vexa/graph/spectralgraphdata.h>
@@ -28,9 +28,7 @@ private Q_SLOTS:
     void paints();
 
 private:
-    std::shared_ptr<AppearanceViewDataModel> m_data;
-    std::shared_ptr<TrialSelectionModel> m_selection;
-    std::vector<std::shared_ptr<Trial>> m_trials;
+    graphfixtures::Page m_page;
 };
 
 namespace {
@@ -52,13 +50,8 @@ QStringList names(const SpectralView *view)
 
 void tst_SpectralPlotWidget::init()
 {
-    m_data = std::make_shared<AppearanceViewDataModel>(ColorimetricCondition());
-    m_selection = std::make_shared<TrialSelectionModel>();
-    m_trials = {fixtures::trial(QStringLiteral("T1"), 0.22), fixtures::trial(QStringLiteral("T2"), 0.18),
-                fixtures::trial(QStringLiteral("T3"), 0.25, {QStringLiteral("45as15"), QStringLiteral("45as45")})};
-    m_data->setStandard(fixtures::standard(QStringLiteral("STD"), 0.20));
-    m_data->setTrials(m_trials);
-    m_selection->setActiveTrials(m_trials);
+    m_page.reset({fixtures::trial(QStringLiteral("T1"), 0.22), fixtures::trial(QStringLiteral("T2"), 0.18),
+                  fixtures::trial(QStringLiteral("T3"), 0.25, {QStringLiteral("45as15"), QStringLiteral("45as45")})});
 }
 
 void tst_SpectralPlotWidget::withoutModels()
@@ -66,14 +59,14 @@ void tst_SpectralPlotWidget::withoutModels()
     SpectralPlotWidget widget;
     QVERIFY(widget.view()->data().empty());
     QVERIFY(!widget.view()->info().empty());
-    widget.setModels(m_data, nullptr);
+    widget.setModels(m_page.data, nullptr);
     QVERIFY(widget.view()->data().empty());
 }
 
 void tst_SpectralPlotWidget::selectedGeometry()
 {
     SpectralPlotWidget widget;
-    widget.setModels(m_data, m_selection);
+    widget.setModels(m_page.data, m_page.selection);
     const SpectralView *view = widget.view();
     // The active trials first (pale, drawn under), then the standard and the selected trial.
     QCOMPARE(names(view), QStringList({"Active trials (3)", "STD", "T1"}));
@@ -88,7 +81,7 @@ void tst_SpectralPlotWidget::selectedGeometry()
     QCOMPARE(standard->colorIndex(), 0);
     QCOMPARE(selected->colorIndex(), 1);
     QCOMPARE(group(view, 1)->color(), standard->color());
-    QCOMPARE(selected->spectrum(), m_trials[0]->appearanceValues()->reflectanceAt(Geometry("45as45")));
+    QCOMPARE(selected->spectrum(), m_page.trials[0]->appearanceValues()->reflectanceAt(Geometry("45as45")));
     QCOMPARE(widget.titleLabel()->text(), QStringLiteral("T1 against STD at 45as45, with 2 other active trials"));
     QVERIFY(view->info().empty());
 
@@ -101,35 +94,35 @@ void tst_SpectralPlotWidget::followsTheSelection()
 {
     SpectralPlotWidget widget;
     widget.resize(600, 400);
-    widget.setModels(m_data, m_selection);
+    widget.setModels(m_page.data, m_page.selection);
     widget.grab();
     const auto layer = widget.view()->data().front();
     QCOMPARE(widget.view()->cachedSeriesRenderCount(), 1);
-    m_selection->setSelectedTrial(m_trials[1]);
+    m_page.selection->setSelectedTrial(m_page.trials[1]);
     QCOMPARE(names(widget.view()), QStringList({"Active trials (3)", "STD", "T2"}));
     // Selecting another trial keeps the layer of active trials, drawn once.
     QCOMPARE(widget.view()->data().front(), layer);
     widget.grab();
     QCOMPARE(widget.view()->cachedSeriesRenderCount(), 1);
-    m_selection->setSelectedColorGeometry(Geometry("45as15"));
+    m_page.selection->setSelectedColorGeometry(Geometry("45as15"));
     QVERIFY(widget.view()->data().front() != layer);
     widget.grab();
     QCOMPARE(widget.view()->cachedSeriesRenderCount(), 2);
     const auto selected = std::dynamic_pointer_cast<SpectralGraphData>(group(widget.view(), 2)->subData().front());
-    QCOMPARE(selected->spectrum(), m_trials[1]->appearanceValues()->reflectanceAt(Geometry("45as15")));
+    QCOMPARE(selected->spectrum(), m_page.trials[1]->appearanceValues()->reflectanceAt(Geometry("45as15")));
     // Only the selected trial active: no group of others.
-    m_selection->setActiveTrials({m_trials[1]});
+    m_page.selection->setActiveTrials({m_page.trials[1]});
     QCOMPARE(names(widget.view()), QStringList({"STD", "T2"}));
     // No standard: the trial alone.
-    m_data->setStandard(nullptr);
+    m_page.data->setStandard(nullptr);
     QCOMPARE(names(widget.view()), QStringList({"T2"}));
 }
 
 void tst_SpectralPlotWidget::missingSpectraAreNamed()
 {
     SpectralPlotWidget widget;
-    widget.setModels(m_data, m_selection);
-    m_selection->setSelectedColorGeometry(Geometry("45as110"));
+    widget.setModels(m_page.data, m_page.selection);
+    m_page.selection->setSelectedColorGeometry(Geometry("45as110"));
     QCOMPARE(QString::fromStdString(widget.view()->info()), QStringLiteral("No spectrum at 45as110: T3"));
     QCOMPARE(group(widget.view(), 0)->subData().size(), size_t(2)); // T1 and T2
 }
@@ -137,7 +130,7 @@ void tst_SpectralPlotWidget::missingSpectraAreNamed()
 void tst_SpectralPlotWidget::allGeometries()
 {
     SpectralPlotWidget widget;
-    widget.setModels(m_data, m_selection);
+    widget.setModels(m_page.data, m_page.selection);
     widget.setScope(SpectralScope::AllGeometries);
     const SpectralView *view = widget.view();
     QCOMPARE(names(view), QStringList({"45as15", "45as45", "45as110"}));
@@ -152,11 +145,11 @@ void tst_SpectralPlotWidget::allGeometries()
     }
     QVERIFY(widget.titleLabel()->text().contains(QStringLiteral("T1")));
 
-    m_selection->setSelectedTrial(m_trials[2]); // has no 45as110
+    m_page.selection->setSelectedTrial(m_page.trials[2]); // has no 45as110
     QCOMPARE(group(view, 2)->subData().size(), size_t(1));
     QCOMPARE(QString::fromStdString(view->info()), QStringLiteral("No spectrum: T3 45as110"));
 
-    m_selection->setColorGeometryFilter({Geometry("45as15")});
+    m_page.selection->setColorGeometryFilter({Geometry("45as15")});
     QCOMPARE(names(view), QStringList({"45as15"}));
 }
 
@@ -164,7 +157,7 @@ void tst_SpectralPlotWidget::paints()
 {
     SpectralPlotWidget widget;
     widget.resize(700, 420);
-    widget.setModels(m_data, m_selection);
+    widget.setModels(m_page.data, m_page.selection);
     const QImage image = widget.grab().toImage();
     QCOMPARE(image.size(), QSize(700, 420));
     widget.setScope(SpectralScope::AllGeometries);

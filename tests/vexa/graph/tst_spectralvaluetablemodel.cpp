@@ -1,4 +1,4 @@
-#include "fixtures.h"
+#include "graphfixtures.h"
 
 #include <vexa/graph/spectralvaluetablemodel.h>
 #include <vexa/models/appearanceviewdatamodel.h>
@@ -32,10 +32,7 @@ private Q_SLOTS:
     void exportRoles();
 
 private:
-    std::shared_ptr<AppearanceViewDataModel> m_data;
-    std::shared_ptr<TrialSelectionModel> m_selection;
-    std::shared_ptr<Standard> m_standard;
-    std::vector<std::shared_ptr<Trial>> m_trials;
+    graphfixtures::Page m_page;
 };
 
 namespace {
@@ -77,14 +74,10 @@ double expected(const std::shared_ptr<AppearanceValues> &values, const char *geo
 
 void tst_SpectralValueTableModel::init()
 {
-    m_data = std::make_shared<AppearanceViewDataModel>(ColorimetricCondition());
-    m_selection = std::make_shared<TrialSelectionModel>();
-    m_standard = fixtures::standard(QStringLiteral("STD"), 0.20);
-    m_trials = {fixtures::trial(QStringLiteral("T1"), 0.22), fixtures::trial(QStringLiteral("T2"), 0.18, fixtures::threeAngles(), 560),
-                fixtures::trial(QStringLiteral("T3"), 0.25)};
-    m_data->setStandard(m_standard);
-    m_data->setTrials(m_trials);
-    m_selection->setActiveTrials({m_trials[0], m_trials[1]});
+    m_page.reset({fixtures::trial(QStringLiteral("T1"), 0.22),
+                  fixtures::trial(QStringLiteral("T2"), 0.18, fixtures::threeAngles(), 560),
+                  fixtures::trial(QStringLiteral("T3"), 0.25)});
+    m_page.selection->setActiveTrials({m_page.trials[0], m_page.trials[1]});
 }
 
 void tst_SpectralValueTableModel::emptyWithoutModels()
@@ -93,7 +86,7 @@ void tst_SpectralValueTableModel::emptyWithoutModels()
     QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
     QCOMPARE(model.rowCount(), 0);
     QCOMPARE(model.columnCount(), 0);
-    model.setModels(nullptr, m_selection);
+    model.setModels(nullptr, m_page.selection);
     QCOMPARE(model.columnCount(), 0);
     QVERIFY(!model.entryAt(0));
     QVERIFY(std::isnan(model.wavelengthAt(0)));
@@ -103,7 +96,7 @@ void tst_SpectralValueTableModel::columnsAtTheSelectedGeometry()
 {
     SpectralValueTableModel model;
     QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     QCOMPARE(headers(model), QStringList({"nm", "STD", "T1", "ΔR T1", "T2", "ΔR T2"}));
     QCOMPARE(model.rowCount(), 31);
     QCOMPARE(model.wavelengthAt(0), 400.0);
@@ -111,17 +104,17 @@ void tst_SpectralValueTableModel::columnsAtTheSelectedGeometry()
     QCOMPARE(model.columnKind(0), SpectralValueTableModel::ColumnKind::Wavelength);
     QCOMPARE(model.columnKind(2), SpectralValueTableModel::ColumnKind::Reflectance);
     QCOMPARE(model.columnKind(3), SpectralValueTableModel::ColumnKind::Difference);
-    QCOMPARE(model.columnOf(m_trials[1]), 4);
-    QCOMPARE(model.columnOf(m_trials[2]), -1);
-    QCOMPARE(model.entryAt(3)->trial, m_trials[0]);
+    QCOMPARE(model.columnOf(m_page.trials[1]), 4);
+    QCOMPARE(model.columnOf(m_page.trials[2]), -1);
+    QCOMPARE(model.entryAt(3)->trial, m_page.trials[0]);
     QCOMPARE(model.entryAt(1)->role, SpectralEntry::Role::Standard);
 
     // A selected trial that is not active is shown last.
-    m_selection->setSelectedTrial(m_trials[2]);
+    m_page.selection->setSelectedTrial(m_page.trials[2]);
     QCOMPARE(headers(model), QStringList({"nm", "STD", "T1", "ΔR T1", "T2", "ΔR T2", "T3", "ΔR T3"}));
     // Toggling the active trials rebuilds; without a standard there are no differences.
-    m_selection->toggleActiveTrial(m_trials[0]);
-    m_data->setStandard(nullptr);
+    m_page.selection->toggleActiveTrial(m_page.trials[0]);
+    m_page.data->setStandard(nullptr);
     QCOMPARE(headers(model), QStringList({"nm", "T2", "T3"}));
 }
 
@@ -139,14 +132,14 @@ void tst_SpectralValueTableModel::valuesAndDifferences()
 {
     QFETCH(QString, geometry);
     QFETCH(double, nm);
-    m_selection->setSelectedColorGeometry(Geometry(geometry));
+    m_page.selection->setSelectedColorGeometry(Geometry(geometry));
     SpectralValueTableModel model;
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     const int row = rowOf(model, nm);
     QVERIFY(row >= 0);
     const QByteArray g = geometry.toLatin1();
-    const double standard = expected(m_standard->appearanceValues(), g.constData(), nm);
-    const double t2 = expected(m_trials[1]->appearanceValues(), g.constData(), nm);
+    const double standard = expected(m_page.standard->appearanceValues(), g.constData(), nm);
+    const double t2 = expected(m_page.trials[1]->appearanceValues(), g.constData(), nm);
     QCOMPARE(cell(model, row, 0), nm);
     QCOMPARE(cell(model, row, 1), standard);
     QCOMPARE(cell(model, row, 4), t2);
@@ -162,8 +155,8 @@ void tst_SpectralValueTableModel::selectingAShownTrialMovesTheHighlight()
 {
     SpectralValueTableModel model;
     QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
-    model.setModels(m_data, m_selection);
-    QCOMPARE(m_selection->selectedTrial(), m_trials[0]);
+    model.setModels(m_page.data, m_page.selection);
+    QCOMPARE(m_page.selection->selectedTrial(), m_page.trials[0]);
     auto bold = [&](int column) { return model.data(model.index(3, column), Qt::FontRole).value<QFont>().bold(); };
     QVERIFY(bold(2) && bold(3));
     QVERIFY(!bold(4) && !bold(1));
@@ -171,7 +164,7 @@ void tst_SpectralValueTableModel::selectingAShownTrialMovesTheHighlight()
     QSignalSpy resets(&model, &QAbstractItemModel::modelReset);
     QSignalSpy changes(&model, &QAbstractItemModel::dataChanged);
     QSignalSpy headerChanges(&model, &QAbstractItemModel::headerDataChanged);
-    m_selection->setSelectedTrial(m_trials[1]);
+    m_page.selection->setSelectedTrial(m_page.trials[1]);
     QCOMPARE(resets.count(), 0);
     QCOMPARE(changes.count(), 1);
     QCOMPARE(headerChanges.count(), 1);
@@ -185,13 +178,13 @@ void tst_SpectralValueTableModel::selectingAShownTrialMovesTheHighlight()
 void tst_SpectralValueTableModel::selectingAnotherGeometryRebuilds()
 {
     SpectralValueTableModel model;
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     const int row = rowOf(model, 550);
     const double at45 = cell(model, row, 1);
     QSignalSpy resets(&model, &QAbstractItemModel::modelReset);
-    m_selection->setSelectedColorGeometry(Geometry("45as15"));
+    m_page.selection->setSelectedColorGeometry(Geometry("45as15"));
     QCOMPARE(resets.count(), 1);
-    QCOMPARE(cell(model, row, 1), expected(m_standard->appearanceValues(), "45as15", 550));
+    QCOMPARE(cell(model, row, 1), expected(m_page.standard->appearanceValues(), "45as15", 550));
     QVERIFY(cell(model, row, 1) > at45); // brighter near the specular
     QCOMPARE(model.entryAt(1)->geometry, Geometry("45as15"));
 }
@@ -200,19 +193,19 @@ void tst_SpectralValueTableModel::allGeometriesOfTheSelectedTrial()
 {
     SpectralValueTableModel model;
     QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     model.setScope(SpectralScope::AllGeometries);
     QCOMPARE(headers(model), QStringList({"nm", "STD 45as15", "T1 45as15", "ΔR T1 45as15", "STD 45as45", "T1 45as45",
                                           "ΔR T1 45as45", "STD 45as110", "T1 45as110", "ΔR T1 45as110"}));
     // The colour geometry filter narrows the geometries.
-    m_selection->setColorGeometryFilter({Geometry("45as110")});
+    m_page.selection->setColorGeometryFilter({Geometry("45as110")});
     QCOMPARE(headers(model), QStringList({"nm", "STD 45as110", "T1 45as110", "ΔR T1 45as110"}));
     // Another selected trial: the table follows (no highlight in this scope).
-    m_selection->setSelectedTrial(m_trials[1]);
+    m_page.selection->setSelectedTrial(m_page.trials[1]);
     QCOMPARE(header(model, 2), QStringLiteral("T2 45as110"));
     QVERIFY(!model.data(model.index(0, 2), Qt::FontRole).value<QFont>().bold());
     // No trial selected: the standard alone.
-    m_selection->setActiveTrials({});
+    m_page.selection->setActiveTrials({});
     QCOMPARE(headers(model), QStringList({"nm", "STD 45as110"}));
 }
 
@@ -224,19 +217,19 @@ void tst_SpectralValueTableModel::mixedGridsAndMissingSpectra()
         standardValues << nm / 1000.0;
     auto standardSpectrum = std::make_shared<ReflectanceSpectrum>(standardValues, 400, 20);
     standardSpectrum->setGeometry(Geometry("45as45"));
-    m_standard->appearanceValues()->setColorValues({standardSpectrum});
+    m_page.standard->appearanceValues()->setColorValues({standardSpectrum});
     QVector<double> trialValues;
     for (int nm = 410; nm <= 650; nm += 10)
         trialValues << nm / 1000.0 + 0.01;
     trialValues[2] = std::nan(""); // 430 nm
     auto trialSpectrum = std::make_shared<ReflectanceSpectrum>(trialValues, 410, 10);
     trialSpectrum->setGeometry(Geometry("45as45"));
-    m_trials[0]->appearanceValues()->setColorValues({trialSpectrum});
-    m_trials[1]->appearanceValues()->setColorValues({});
+    m_page.trials[0]->appearanceValues()->setColorValues({trialSpectrum});
+    m_page.trials[1]->appearanceValues()->setColorValues({});
 
     SpectralValueTableModel model;
     QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::QtTest);
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     QCOMPARE(headers(model), QStringList({"nm", "STD", "T1", "ΔR T1", "T2", "ΔR T2"}));
     // The union of both grids: the trial's 25 wavelengths and the standard's 400, 660, 680, 700.
     QCOMPARE(model.rowCount(), 29);
@@ -260,7 +253,7 @@ void tst_SpectralValueTableModel::mixedGridsAndMissingSpectra()
 void tst_SpectralValueTableModel::exportRoles()
 {
     SpectralValueTableModel model;
-    model.setModels(m_data, m_selection);
+    model.setModels(m_page.data, m_page.selection);
     QCOMPARE(model.data(model.index(0, 0), SpectralValueTableModel::ExportNumberFormatRole).toString(), QStringLiteral("0."));
     QCOMPARE(model.data(model.index(0, 2), SpectralValueTableModel::ExportNumberFormatRole).toString(),
              QStringLiteral("0.0000"));
