@@ -167,9 +167,10 @@ void MainWindow::exportExcel()
     m_statusLabel->setText(tr("Ready"));
 }
 
+// The whole table as the view shows it (sorted, shown columns), not only the rows in view.
 void MainWindow::printTable()
 {
-    m_page->tableWidget()->print();
+    m_page->tableWidget()->printTable();
 }
 
 void MainWindow::printPlotsToPdf()
