@@ -91,7 +91,12 @@ int main(int argc, char **argv)
     QCommandLineOption conditionOption(QStringLiteral("condition"),
                                        QStringLiteral("Batch mode: the colorimetric condition (default D65/10)."),
                                        QStringLiteral("CONDITION"), QStringLiteral("D65/10"));
-    parser.addOptions({storeOption, jobOption, screenshotOption, pageOption, judgeOption, xlsxOption, conditionOption});
+    QCommandLineOption trialsOption(QStringLiteral("trials"),
+                                    QStringLiteral("Show the job grown to N trials (its own, repeated with small "
+                                                   "changes; in memory only), for demonstrations and measurements."),
+                                    QStringLiteral("N"));
+    parser.addOptions({storeOption, jobOption, screenshotOption, pageOption, judgeOption, xlsxOption, conditionOption,
+                       trialsOption});
     parser.process(app);
 
     const QString storePath = parser.isSet(storeOption) ? parser.value(storeOption) : StoreSession::defaultStorePath();
@@ -117,6 +122,7 @@ int main(int argc, char **argv)
         err << "--page: unknown page \"" << parser.value(pageOption) << "\" (colour, spectra)\n";
         return 2;
     }
+    window.setTrialCount(parser.value(trialsOption).toInt());
     auto *watcher = new FirstPaintWatcher(clock, &app);
     window.page()->installEventFilter(watcher);
     QObject::connect(&window, &MainWindow::sgJobShown, watcher, [watcher] { watcher->armed = true; });
