@@ -3,6 +3,8 @@
 #include <vexa/browser/objectbrowsertreeitem.h>
 #include <vexa/vexa_export.h>
 
+#include <context/corvidmodel.h>
+
 #include <QAbstractItemModel>
 #include <QPointer>
 #include <QString>

@@ -3,6 +3,8 @@
 #include <vexa/browser/baseobjecttreemodel.h>
 #include <vexa/vexa_export.h>
 
+#include <context/corvidmodel.h>
+
 #include <QObject>
 #include <QPointer>
 #include <QString>
@@ -16,6 +18,7 @@
 
 namespace vexa {
 
+class Command;
 class CommandDispatcher;
 class CorvidModel;
 class GlobalDirEntry;
