@@ -84,6 +84,9 @@ CorvidObjectsClientModel::CorvidObjectsClientModel(CorvidModel *corvidModel, con
     , m_loader(new FullObjectLoader(this))
 {
     registerDomainMetaTypes();
+    qRegisterMetaType<std::string>("std::string");
+    qRegisterMetaType<std::shared_ptr<vexa::SelectedPath>>("std::shared_ptr<vexa::SelectedPath>");
+    qRegisterMetaType<std::shared_ptr<vexa::ErrorInfo>>("std::shared_ptr<vexa::ErrorInfo>");
     setDefaultDispatcherId(defaultDispatcherId);
     connect(m_loader, &FullObjectLoader::sgObjectsLoaded, this, &CorvidObjectsClientModel::onRemoteObjectsLoaded);
     connect(m_loader, &FullObjectLoader::sgObjectsLoadError, this,
@@ -289,11 +292,16 @@ void CorvidObjectsClientModel::fetchMore(const QModelIndex &parent)
     if (!folder || !folder->isDirty())
         return;
     folder->setIsDirty(false);
-    const QModelIndex folderIndex = index(folder);
-    // A folder marked for reloading forgets what it listed before.
+    // A folder marked for reloading keeps its rows until the new listing replaces them.
     if (folder->numberOfItems() > 0)
-        removeRows(0, folder->numberOfItems(), folderIndex);
+        m_replace.insert(folder->objectId().toStdString());
     loadFolder(folder->objectId().toStdString());
+}
+
+bool CorvidObjectsClientModel::isLoading(const QModelIndex &folder) const
+{
+    const ObjectBrowserTreeItem *row = item(folder);
+    return row && row->isFolder() && m_loading.count(row->objectId().toStdString()) > 0;
 }
 
 void CorvidObjectsClientModel::reload(const QModelIndex &folderIndex)
@@ -473,8 +481,16 @@ void CorvidObjectsClientModel::loadFolder(const std::string &folderId)
         }
         command->generateId();
         dispatcher().execute(
-            command, this, [this](std::shared_ptr<Response> response) { dirEntriesLoaded(std::move(response)); },
-            [this](std::shared_ptr<ErrorInfo> error) { reportCommandError(QStringLiteral("GetDirEntries"), error); });
+            command, this,
+            [this, folderId](std::shared_ptr<Response> response) {
+                m_loading.erase(folderId);
+                dirEntriesLoaded(std::move(response));
+            },
+            [this, folderId](std::shared_ptr<ErrorInfo> error) {
+                m_loading.erase(folderId);
+                reportCommandError(QStringLiteral("GetDirEntries"), error);
+            });
+        m_loading.insert(folderId);
     } catch (const std::exception &e) {
         const QString message = QString::fromStdString(e.what());
         Logger::instance().debug(LogCategory::General,
@@ -496,6 +512,8 @@ void CorvidObjectsClientModel::dirEntriesLoaded(std::shared_ptr<Response> respon
     auto *folder = dynamic_cast<ObjectBrowserFolder *>(m_rootFolder.itemWithID(request->parentFolderId().toStdString()));
     if (!folder)
         return; // the folder went away meanwhile
+    if (m_replace.erase(request->parentFolderId().toStdString()) > 0 && folder->numberOfItems() > 0)
+        removeRows(0, folder->numberOfItems(), index(folder));
     insertEntries(folder, listing->dirEntries());
     Q_EMIT sgFolderLoaded(index(folder));
 }
@@ -591,7 +609,7 @@ void CorvidObjectsClientModel::onFolderCreated(std::shared_ptr<Response> respons
     QStringList ids;
     QStringList names;
     parent->path(&ids, &names);
-    const auto &entry = added->dirEntries().front();
+    const std::shared_ptr<DirEntry> entry = added->dirEntries().front();
     ids << entry->entryObjectId();
     names << entry->header().name();
     Q_EMIT sgNewFolderCreated(

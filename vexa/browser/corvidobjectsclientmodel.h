@@ -1,5 +1,6 @@
 #pragma once
 
+#include <vexa/browser/browsermetatypes.h>
 #include <vexa/browser/objectbrowsertreeitem.h>
 #include <vexa/vexa_export.h>
 
@@ -10,6 +11,7 @@
 #include <QString>
 
 #include <map>
+#include <set>
 #include <memory>
 #include <string>
 #include <vector>
@@ -128,6 +130,8 @@ public:
     QModelIndex indexOfObject(const QString &objectId) const;
     // Lists a folder's entries (the root for an empty id); nothing without a CorvidModel.
     void loadFolder(const std::string &folderId);
+    // True while a folder's entries are on the way.
+    bool isLoading(const QModelIndex &folder) const;
     // Forgets a folder's rows and lists them again.
     void reload(const QModelIndex &folder);
 
@@ -213,7 +217,9 @@ private:
     std::vector<int> m_columns;
     std::map<size_t, std::shared_ptr<CopyContext>> m_copies;
     std::map<std::string, QPointer<QWidget>> m_deleteSources;
-    std::string m_errorCommandId; // The delete whose error is being reported.
+    std::string m_errorCommandId;
+    std::set<std::string> m_loading; // Folder ids being listed.
+    std::set<std::string> m_replace; // Folder ids whose rows the next listing replaces. // The delete whose error is being reported.
     FullObjectLoader *m_loader; // Child.
 };
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <vexa/browser/baseobjecttreemodel.h>
+#include <vexa/browser/browsermetatypes.h>
 #include <vexa/vexa_export.h>
 
 #include <context/corvidmodel.h>

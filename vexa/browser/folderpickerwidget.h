@@ -1,5 +1,6 @@
 #pragma once
 
+#include <vexa/browser/browsermetatypes.h>
 #include <vexa/vexa_export.h>
 
 #include <context/corvidmodel.h>
