@@ -17,6 +17,7 @@
 #include <QPushButton>
 #include <QApplication>
 #include <QMessageBox>
+#include <QPointer>
 #include <QTimer>
 #include <QtTest>
 
@@ -116,6 +117,8 @@ struct SeenBox
     Qt::WindowFlags flags;
     QMessageBox::StandardButton defaultButton = QMessageBox::NoButton;
     QMessageBox::StandardButtons buttons;
+    QPointer<QTimer> answerer; // Gone once it answered; delete it to stop waiting.
+    ~SeenBox() { delete answerer.data(); }
 };
 
 // Presses button in the next modal message box that opens within 30 s.
@@ -125,7 +128,10 @@ inline std::shared_ptr<SeenBox> answerNextMessageBox(QMessageBox::StandardButton
     auto *timer = new QTimer(qApp);
     timer->setInterval(5);
     QTimer::singleShot(30000, timer, [timer] { timer->deleteLater(); });
-    QObject::connect(timer, &QTimer::timeout, timer, [timer, seen, button] {
+    seen->answerer = timer;
+    SeenBox *record = seen.get(); // The record outlives the timer (its destructor deletes it).
+    QObject::connect(timer, &QTimer::timeout, timer, [timer, record, button] {
+        SeenBox *seen = record;
         auto *box = qobject_cast<QMessageBox *>(QApplication::activeModalWidget());
         if (!box)
             return;
