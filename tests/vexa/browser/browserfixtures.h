@@ -14,6 +14,8 @@
 #include <store/sqliteobjectstore.h>
 
 #include <QAbstractButton>
+#include <QAbstractItemModelTester>
+#include <QIdentityProxyModel>
 #include <QPushButton>
 #include <QApplication>
 #include <QMessageBox>
@@ -25,6 +27,32 @@
 #include <memory>
 
 namespace browserfixtures {
+
+// The invalid index of the browser's models answers more flags than the model tester
+// allows (the empty area of a view is enabled, or stands for the root node), so the
+// tester looks at them through this proxy, which shows the invalid index's drop flag alone.
+class EmptyAreaDropFlagOnly : public QIdentityProxyModel
+{
+public:
+    using QIdentityProxyModel::QIdentityProxyModel;
+    Qt::ItemFlags flags(const QModelIndex &index) const override
+    {
+        const Qt::ItemFlags flags = QIdentityProxyModel::flags(index);
+        return index.isValid() ? flags : flags & Qt::ItemIsDropEnabled;
+    }
+};
+
+// A model tester looking through EmptyAreaDropFlagOnly.
+struct ModelTester
+{
+    explicit ModelTester(QAbstractItemModel *model)
+    {
+        proxy.setSourceModel(model);
+        tester = std::make_unique<QAbstractItemModelTester>(&proxy, QAbstractItemModelTester::FailureReportingMode::QtTest);
+    }
+    EmptyAreaDropFlagOnly proxy;
+    std::unique_ptr<QAbstractItemModelTester> tester;
+};
 
 // Adds objects to a folder of a store file (the root for an empty id); returns their ids.
 inline QStringList add(vexa::ObjectStore &store, const std::vector<std::shared_ptr<vexa::BaseObject>> &objects,

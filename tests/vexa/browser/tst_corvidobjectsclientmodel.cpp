@@ -43,19 +43,6 @@ public:
     using CorvidObjectsClientModel::dirEntriesLoaded;
 };
 
-// The empty area of the browser's views is enabled as well as drop-enabled; the model
-// tester allows only the drop flag there, so it looks at the model through this proxy.
-class EmptyAreaDropFlagOnly : public QIdentityProxyModel
-{
-public:
-    using QIdentityProxyModel::QIdentityProxyModel;
-    Qt::ItemFlags flags(const QModelIndex &index) const override
-    {
-        const Qt::ItemFlags flags = QIdentityProxyModel::flags(index);
-        return index.isValid() ? flags : flags & Qt::ItemIsDropEnabled;
-    }
-};
-
 QStringList names(const QAbstractItemModel &model, const QModelIndex &parent = QModelIndex())
 {
     QStringList result;
