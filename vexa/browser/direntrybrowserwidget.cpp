@@ -101,7 +101,7 @@ void DirEntryBrowserWidget::showMessage(const QString &message)
 
 QString DirEntryBrowserWidget::message() const
 {
-    return m_messageLabel && m_messageLabel->isVisible() ? m_messageLabel->text() : QString();
+    return m_messageLabel && !m_messageLabel->isHidden() ? m_messageLabel->text() : QString();
 }
 
 void DirEntryBrowserWidget::createCustomMenus(QMenu *menu, QString kind, QString kinds, bool withShortcuts)
