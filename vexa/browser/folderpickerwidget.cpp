@@ -6,6 +6,7 @@
 #include "objectbrowserwidget.h"
 #include "selectedpath.h"
 
+#include <domain/domainmetatypes.h>
 #include <domain/folder.h>
 #include <domain/globaldirentry.h>
 
@@ -24,6 +25,7 @@ FolderPickerWidget::FolderPickerWidget(QWidget *parent)
     , m_browseButton(new QToolButton(this))
 {
     qRegisterMetaType<std::string>("std::string");
+    registerDomainMetaTypes();
     m_label->setObjectName(QStringLiteral("folderPickerLabel"));
     m_comboBox->setObjectName(QStringLiteral("folderPickerComboBox"));
     m_comboBox->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
