@@ -305,6 +305,7 @@ void ObjectBrowserWidget::initialize(CorvidModel *corvidModel, const std::string
     connect(m_folderView->selectionModel(), &QItemSelectionModel::currentChanged, this,
             [this](const QModelIndex &current) { onFolderViewCurrentChanged(current); });
     connect(m_detailView, &QAbstractItemView::activated, this, &ObjectBrowserWidget::onDetailActivated);
+    connect(m_folderView, &QAbstractItemView::activated, this, [this] { m_detailView->setFocus(); });
     connect(m_detailView->selectionModel(), &QItemSelectionModel::selectionChanged, this, [this] {
         Q_EMIT sgSelectionChanged(selectedEntries());
         updateStatus();
@@ -349,9 +350,11 @@ void ObjectBrowserWidget::buildActions()
         auto *action = new QAction(text, this);
         if (!keys.isEmpty())
             action->setShortcut(keys);
-        action->setShortcutContext(Qt::WidgetWithChildrenShortcut);
+        // Only while a view itself has the focus: an open editor keeps its own keys.
+        action->setShortcutContext(Qt::WidgetShortcut);
         connect(action, &QAction::triggered, this, slot);
-        addAction(action);
+        m_folderView->addAction(action);
+        m_detailView->addAction(action);
         return action;
     };
     m_newFolderAction = make(tr("New folder"), QKeySequence(tr("Ctrl+Shift+N")), &ObjectBrowserWidget::newFolder);
@@ -359,10 +362,10 @@ void ObjectBrowserWidget::buildActions()
     m_deleteAction = make(tr("Delete…"), QKeySequence::Delete, &ObjectBrowserWidget::deleteSelected);
     m_copyAction = make(tr("Copy"), QKeySequence::Copy, &ObjectBrowserWidget::copySelected);
     m_pasteAction = make(tr("Paste"), QKeySequence::Paste, &ObjectBrowserWidget::paste);
-    m_openAction = make(tr("Open"), QKeySequence(Qt::Key_Return), &ObjectBrowserWidget::openSelected);
+    // Enter opens through the views' activated().
+    m_openAction = make(tr("Open"), QKeySequence(), &ObjectBrowserWidget::openSelected);
     m_reloadAction = make(tr("Reload"), QKeySequence::Refresh, &ObjectBrowserWidget::reloadCurrentFolder);
     m_favouriteAction = make(tr("Add folder to favourites"), QKeySequence(), &ObjectBrowserWidget::addCurrentFolderToFavourites);
-    m_openAction->setShortcuts({QKeySequence(Qt::Key_Return), QKeySequence(Qt::Key_Enter)});
 }
 
 void ObjectBrowserWidget::setFolderPickerSettings(std::shared_ptr<FolderPickerSettings> settings)
