@@ -88,7 +88,11 @@ int main(int argc, char **argv)
     QCommandLineOption conditionOption(QStringLiteral("condition"),
                                        QStringLiteral("Batch mode: the colorimetric condition (default D65/10)."),
                                        QStringLiteral("CONDITION"), QStringLiteral("D65/10"));
-    parser.addOptions({storeOption, jobOption, screenshotOption, judgeOption, xlsxOption, conditionOption});
+    QCommandLineOption trialsOption(QStringLiteral("trials"),
+                                    QStringLiteral("Show the job grown to N trials (its own, repeated with small "
+                                                   "changes; in memory only), for demonstrations and measurements."),
+                                    QStringLiteral("N"));
+    parser.addOptions({storeOption, jobOption, screenshotOption, judgeOption, xlsxOption, conditionOption, trialsOption});
     parser.process(app);
 
     const QString storePath = parser.isSet(storeOption) ? parser.value(storeOption) : StoreSession::defaultStorePath();
@@ -110,6 +114,7 @@ int main(int argc, char **argv)
     auto generalSettings = SettingsManager::instance().getGeneralSettings();
 
     MainWindow window(generalSettings, viewSettings);
+    window.setTrialCount(parser.value(trialsOption).toInt());
     auto *watcher = new FirstPaintWatcher(clock, &app);
     window.page()->installEventFilter(watcher);
     QObject::connect(&window, &MainWindow::sgJobShown, watcher, [watcher] { watcher->armed = true; });

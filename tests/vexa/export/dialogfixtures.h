@@ -5,6 +5,8 @@
 
 #include <vexa/export/dialogrunner.h>
 
+#include <common/testprerequisites.h>
+
 #include <QDialog>
 #include <QFileDialog>
 #include <QJsonDocument>
@@ -54,17 +56,10 @@ struct RunDialogs
     RunDialogs &operator=(const RunDialogs &) = delete;
 };
 
-// Debian's Python with python3-openpyxl (not whichever python3 comes first on PATH).
+// Debian's Python with python3-openpyxl and python3-pil (openpyxl reads images through Pillow).
 inline QString workbookReaderPython()
 {
-    return QStringLiteral("/usr/bin/python3");
-}
-
-inline bool workbookReaderAvailable()
-{
-    QProcess probe;
-    probe.start(workbookReaderPython(), {QStringLiteral("-c"), QStringLiteral("import openpyxl")});
-    return probe.waitForFinished(30000) && probe.exitStatus() == QProcess::NormalExit && probe.exitCode() == 0;
+    return testprerequisites::python();
 }
 
 // The workbook as openpyxl reads it (see read_xlsx.py); an empty object when it cannot be read,
