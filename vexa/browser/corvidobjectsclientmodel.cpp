@@ -3,6 +3,8 @@
 #include "dispatcherconnection_p.h"
 #include "selectedpath.h"
 
+#include <vexa/widgets/uihelper.h>
+
 #include <context/addobject.h>
 #include <context/addobjectresponse.h>
 #include <context/commanddispatcher.h>
@@ -799,25 +801,34 @@ bool CorvidObjectsClientModel::moveRows(const QModelIndex &sourceParent, int sou
     return true;
 }
 
-void CorvidObjectsClientModel::sendMove(const QString &objectId, const QString &targetFolderId)
+namespace {
+
+// A MoveObject or CopyObject of one object into a folder.
+template<class Request>
+std::shared_ptr<Request> intoFolder(const QString &objectId, const QString &targetFolderId)
 {
-    auto command = std::make_shared<MoveObject>();
+    auto command = std::make_shared<Request>();
     command->setId(objectId);
     command->setTargetFolderId(targetFolderId);
     command->generateId();
+    return command;
+}
+
+} // namespace
+
+void CorvidObjectsClientModel::sendMove(const QString &objectId, const QString &targetFolderId)
+{
     dispatcher().execute(
-        command, this, [this](std::shared_ptr<Response> response) { onObjectMoved(std::move(response)); },
+        intoFolder<MoveObject>(objectId, targetFolderId), this,
+        [this](std::shared_ptr<Response> response) { onObjectMoved(std::move(response)); },
         [this](std::shared_ptr<ErrorInfo> error) { reportCommandError(QStringLiteral("MoveObject"), error); });
 }
 
 void CorvidObjectsClientModel::sendCopy(const QString &objectId, const QString &targetFolderId)
 {
-    auto command = std::make_shared<CopyObject>();
-    command->setId(objectId);
-    command->setTargetFolderId(targetFolderId);
-    command->generateId();
     dispatcher().execute(
-        command, this, [this](std::shared_ptr<Response> response) { onObjectCopied(std::move(response)); },
+        intoFolder<CopyObject>(objectId, targetFolderId), this,
+        [this](std::shared_ptr<Response> response) { onObjectCopied(std::move(response)); },
         [this](std::shared_ptr<ErrorInfo> error) { reportCommandError(QStringLiteral("CopyObject"), error); });
 }
 
@@ -872,25 +883,15 @@ void CorvidObjectsClientModel::onObjectCopied(std::shared_ptr<Response> response
 std::vector<CorvidObjectsClientModel::CargoItem> CorvidObjectsClientModel::cargoFromMimeData(const QMimeData *data)
 {
     std::vector<CargoItem> cargo;
-    const QString format = QStringLiteral("application/x-qabstractitemmodeldatalist");
-    if (!data || !data->hasFormat(format))
-        return cargo;
-    registerDomainMetaTypes();
-    QByteArray bytes = data->data(format);
-    QDataStream stream(&bytes, QIODevice::ReadOnly);
     QSet<QString> seen;
-    while (!stream.atEnd()) {
-        int row = 0;
-        int column = 0;
-        QMap<int, QVariant> roles;
-        stream >> row >> column >> roles;
-        if (stream.status() != QDataStream::Ok)
-            break;
+    int position = 0;
+    for (const QMap<int, QVariant> &roles : UIHelper::itemDataFromMimeData(data)) {
         const auto entry = roles.value(GlobalDirEntryRole).value<std::shared_ptr<GlobalDirEntry>>();
+        ++position;
         if (!entry || entry->entryObjectId().isEmpty() || seen.contains(entry->entryObjectId()))
             continue;
         seen.insert(entry->entryObjectId());
-        cargo.emplace_back(row, column, entry);
+        cargo.emplace_back(position - 1, 0, entry);
     }
     return cargo;
 }

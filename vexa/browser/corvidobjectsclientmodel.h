@@ -66,7 +66,7 @@ public:
         IsFolderRole = Qt::UserRole + 3,
     };
 
-    // One dragged row as a drop reads it.
+    // One dragged row as a drop reads it: its position among the dragged cells and its entry.
     class VEXA_EXPORT CargoItem
     {
     public:

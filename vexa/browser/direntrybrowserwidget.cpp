@@ -1,6 +1,7 @@
 #include "direntrybrowserwidget.h"
 
 #include "direntrybrowserinterface.h"
+#include "direntrypaths_p.h"
 #include "direntrypersistancemanager.h"
 #include "direntrytreeview.h"
 #include "objectbrowserdialog.h"
@@ -275,21 +276,8 @@ DirEntryBrowserWidget::DirEntryNode *DirEntryBrowserWidget::associatedDirEntyNod
 std::shared_ptr<GlobalDirEntry> DirEntryBrowserWidget::folderFor(DirEntryNode *node, bool askForFolder)
 {
     const auto entry = node->globalDirEntry();
-    if (entry && !entry->dispatcherID().isEmpty()) {
-        // The folder recorded when the object was made.
-        auto folder = std::make_shared<GlobalDirEntry>();
-        folder->setDispatcherID(entry->dispatcherID());
-        folder->setStandardizedDispatcherID(entry->standardizedDispatcherID());
-        QStringList path = entry->path();
-        QStringList names = entry->stringPath();
-        folder->setEntryObjectType(Folder::typeId());
-        folder->setEntryObjectId(path.isEmpty() ? QString() : path.takeLast());
-        if (!names.isEmpty())
-            folder->header().setName(names.takeLast());
-        folder->setPath(path);
-        folder->setStringPath(names);
-        return folder;
-    }
+    if (entry && !entry->dispatcherID().isEmpty())
+        return folderHolding(*entry); // the folder recorded when the object was made
     return askForFolder ? pickFolder() : nullptr;
 }
 

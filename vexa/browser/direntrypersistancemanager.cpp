@@ -1,5 +1,6 @@
 #include "direntrypersistancemanager.h"
 
+#include "direntrypaths_p.h"
 #include "dispatcherconnection_p.h"
 
 #include <context/addobject.h>
@@ -162,21 +163,12 @@ void DirEntryPersistanceManager::loadAllObjects(const std::string &key, std::sha
     auto command = std::make_shared<GetDirEntries>();
     command->setParentFolderId(folder ? folder->entryObjectId() : QString());
     send(key, command, &DirEntryPersistanceManager::onObjectsLoaded, &DirEntryPersistanceManager::onObjectLoadError);
+    // Where the listed entries live.
     auto listed = std::make_shared<GlobalDirEntry>();
     if (folder)
-        listed->setDirEntry(*folder);
+        placeInside(*listed, *folder);
     listed->setDispatcherID(QString::fromStdString(key));
-    if (folder) {
-        // The entries' path is the folder's own path followed by the folder.
-        QStringList path = folder->path();
-        QStringList names = folder->stringPath();
-        if (!folder->entryObjectId().isEmpty()) {
-            path << folder->entryObjectId();
-            names << folder->header().name();
-        }
-        listed->setPath(path);
-        listed->setStringPath(names);
-    }
+    listed->setStandardizedDispatcherID(QString::fromStdString(CommandDispatcher::standardizedDispatcherId(key)));
     m_listings[m_lastCommandId] = listed;
 }
 
@@ -195,8 +187,7 @@ void DirEntryPersistanceManager::onObjectsLoaded(std::shared_ptr<Response> respo
             auto global = std::make_shared<GlobalDirEntry>(*entry);
             if (folder) {
                 global->setDispatcherID(folder->dispatcherID());
-                global->setStandardizedDispatcherID(
-                    QString::fromStdString(CommandDispatcher::standardizedDispatcherId(folder->dispatcherID().toStdString())));
+                global->setStandardizedDispatcherID(folder->standardizedDispatcherID());
                 global->setPath(folder->path());
                 global->setStringPath(folder->stringPath());
             }
@@ -278,17 +269,20 @@ void DirEntryPersistanceManager::storeObject(std::shared_ptr<BaseObject> object,
     const std::string key = folder ? folder->dispatcherID().toStdString() : std::string();
     send(key, command, &DirEntryPersistanceManager::onObjectStored, &DirEntryPersistanceManager::onObjectAddError,
          &DirEntryPersistanceManager::onObjectStoreProgress);
-    auto where = std::make_shared<GlobalDirEntry>();
-    if (folder)
-        where->setDirEntry(*folder);
-    where->setDispatcherID(QString::fromStdString(key));
-    if (folder) {
-        where->setPath(folder->path());
-        where->setStringPath(folder->stringPath());
-    }
-    m_saves[m_lastCommandId] = Save{where, std::move(onStored), nullptr};
+    m_saves[m_lastCommandId] = Save{folder, std::move(onStored), nullptr};
     if (m_corvidModel)
         m_corvidModel->progressModel()->startProgress(tr("Saving"), 0.05, m_lastCommandId);
+}
+
+DirEntryPersistanceManager::Save DirEntryPersistanceManager::takeSave(const std::string &commandId)
+{
+    Save save;
+    const auto it = m_saves.find(commandId);
+    if (it != m_saves.end()) {
+        save = it->second;
+        m_saves.erase(it);
+    }
+    return save;
 }
 
 void DirEntryPersistanceManager::onObjectStoreProgress(std::shared_ptr<Progress> progress)
@@ -300,12 +294,7 @@ void DirEntryPersistanceManager::onObjectStored(std::shared_ptr<Response> respon
 {
     const std::string commandId = response ? response->commandId() : std::string();
     endTask(commandId);
-    Save save;
-    const auto it = m_saves.find(commandId);
-    if (it != m_saves.end()) {
-        save = it->second;
-        m_saves.erase(it);
-    }
+    const Save save = takeSave(commandId);
     const auto added = std::dynamic_pointer_cast<AddObjectResponse>(response);
     if (!added || added->dirEntries().empty()) {
         const QString text = tr("Error occured during AddObject: (nullptr loaded)");
@@ -315,19 +304,8 @@ void DirEntryPersistanceManager::onObjectStored(std::shared_ptr<Response> respon
         return;
     }
     auto entry = std::make_shared<GlobalDirEntry>(*added->dirEntries().front());
-    if (save.folder) {
-        entry->setDispatcherID(save.folder->dispatcherID());
-        entry->setStandardizedDispatcherID(QString::fromStdString(
-            CommandDispatcher::standardizedDispatcherId(save.folder->dispatcherID().toStdString())));
-        QStringList path = save.folder->path();
-        QStringList names = save.folder->stringPath();
-        if (!save.folder->entryObjectId().isEmpty()) {
-            path << save.folder->entryObjectId();
-            names << save.folder->header().name();
-        }
-        entry->setPath(path);
-        entry->setStringPath(names);
-    }
+    if (save.folder)
+        placeInside(*entry, *save.folder);
     if (save.onStored)
         save.onStored(entry);
     Q_EMIT sgRequestFinished(commandId, true);
@@ -366,12 +344,7 @@ void DirEntryPersistanceManager::onObjectUpdated(std::shared_ptr<Response> respo
 {
     const std::string commandId = response ? response->commandId() : std::string();
     endTask(commandId);
-    Save save;
-    const auto it = m_saves.find(commandId);
-    if (it != m_saves.end()) {
-        save = it->second;
-        m_saves.erase(it);
-    }
+    const Save save = takeSave(commandId);
     const auto updated = std::dynamic_pointer_cast<UpdateObjectResponse>(response);
     std::shared_ptr<BaseObject> object = updated ? updated->updatedObject() : nullptr;
     if (!object) {

@@ -112,6 +112,7 @@ private:
         std::function<void(std::shared_ptr<BaseObject>)> onUpdated;
     };
 
+    Save takeSave(const std::string &commandId);
     // The command whose answer is being handled (the sending QtCommand's), else null.
     std::shared_ptr<Command> answeredCommand() const;
     std::string answeredCommandId() const;

@@ -1,6 +1,7 @@
 #include "direntrytreemodel.h"
 
 #include "corvidobjectsclientmodel.h"
+#include "direntrypaths_p.h"
 #include "selectedpath.h"
 
 #include <vexa/widgets/imagerepository.h>
@@ -174,19 +175,8 @@ DirEntryTreeModel::DirEntryNode *DirEntryTreeModel::addNewObject(const std::shar
     auto entry = std::make_shared<GlobalDirEntry>();
     entry->setEntryObjectType(object->typeName());
     entry->setHeader(object->header());
-    if (folder) {
-        entry->setDispatcherID(folder->dispatcherID());
-        entry->setStandardizedDispatcherID(folder->standardizedDispatcherID());
-        QStringList path = folder->path();
-        QStringList names = folder->stringPath();
-        if (!folder->entryObjectId().isEmpty()) {
-            path << folder->entryObjectId();
-            names << folder->header().name();
-        }
-        entry->setPath(path);
-        entry->setStringPath(names);
-        entry->setParentFolderId(folder->entryObjectId());
-    }
+    if (folder)
+        placeInside(*entry, *folder);
     auto *root = static_cast<GeneralBranchNode *>(rootNode().get());
     const int row = root->childrenCount();
     auto *node = static_cast<DirEntryNode *>(newDirEntryNode(entry, root));

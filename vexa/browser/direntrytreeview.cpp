@@ -1,5 +1,6 @@
 #include "direntrytreeview.h"
 
+#include "direntrypaths_p.h"
 #include "direntrypersistancemanager.h"
 
 #include <domain/baseobject.h>
@@ -7,6 +8,7 @@
 
 #include <QHeaderView>
 #include <QKeyEvent>
+#include <QPointer>
 
 #include <functional>
 
@@ -139,25 +141,17 @@ void DirEntryTreeView::duplicateSelectedNodes(std::shared_ptr<GlobalDirEntry> fo
             // Beside the original.
             auto *entryNode = dynamic_cast<DirEntryTreeModel::DirEntryNode *>(node);
             const auto original = entryNode ? entryNode->globalDirEntry() : nullptr;
-            if (original) {
-                target = std::make_shared<GlobalDirEntry>();
-                target->setDispatcherID(original->dispatcherID());
-                target->setStandardizedDispatcherID(original->standardizedDispatcherID());
-                QStringList path = original->path();
-                QStringList names = original->stringPath();
-                target->setEntryObjectId(path.isEmpty() ? QString() : path.takeLast());
-                target->setEntryObjectType(QStringLiteral("Folder"));
-                if (!names.isEmpty())
-                    target->header().setName(names.takeLast());
-                target->setPath(path);
-                target->setStringPath(names);
-            }
+            if (original)
+                target = folderHolding(*original);
         }
-        persistance->storeObject(copy, target, [m, copy](std::shared_ptr<GlobalDirEntry> entry) {
-            auto *added = m->openDirEntry(entry);
+        QPointer<DirEntryTreeModel> model = m;
+        persistance->storeObject(copy, target, [model, copy](std::shared_ptr<GlobalDirEntry> entry) {
+            if (!model)
+                return;
+            auto *added = model->openDirEntry(entry);
             if (added && !added->cargo()) {
                 added->setItem(copy, true);
-                m->redrawNode(added);
+                model->redrawNode(added);
             }
         });
     }
