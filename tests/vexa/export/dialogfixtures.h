@@ -11,6 +11,8 @@
 #include <QFileDialog>
 #include <QJsonDocument>
 #include <QJsonObject>
+#include <QPrintDialog>
+#include <QPrinter>
 #include <QProcess>
 #include <QStringList>
 
@@ -54,6 +56,35 @@ struct RunDialogs
     ~RunDialogs() { vexa::DialogRunner::setFunction(nullptr); }
     RunDialogs(const RunDialogs &) = delete;
     RunDialogs &operator=(const RunDialogs &) = delete;
+};
+
+// Runs print dialogs by printing into a PDF file and records what the dialog showed; any
+// other dialog is cancelled. `before` runs first, when the dialog is shown.
+struct PrintToPdf
+{
+    explicit PrintToPdf(QString file, std::function<void(QDialog &)> before = nullptr)
+    {
+        vexa::DialogRunner::setFunction([file, before, this](QDialog &dialog) {
+            ++shown;
+            title = dialog.windowTitle();
+            parent = dialog.parentWidget();
+            if (before)
+                before(dialog);
+            auto *printDialog = qobject_cast<QPrintDialog *>(&dialog);
+            if (!printDialog)
+                return int(QDialog::Rejected);
+            printDialog->printer()->setOutputFormat(QPrinter::PdfFormat);
+            printDialog->printer()->setOutputFileName(file);
+            return int(QDialog::Accepted);
+        });
+    }
+    ~PrintToPdf() { vexa::DialogRunner::setFunction(nullptr); }
+    PrintToPdf(const PrintToPdf &) = delete;
+    PrintToPdf &operator=(const PrintToPdf &) = delete;
+
+    int shown = 0;
+    QString title;
+    QWidget *parent = nullptr;
 };
 
 // Debian's Python with python3-openpyxl and python3-pil (openpyxl reads images through Pillow).

@@ -162,14 +162,7 @@ private Q_SLOTS:
         const QString pdf = m_dir.filePath("table-dialog.pdf");
         TablePrinter printer(proxyOf({"Name", "Geo", "dE"}, {{"T1", "45as15", "1.25"}}));
         printer.setTitle("Colour table", "", "");
-        RunDialogs accept([&pdf](QDialog &dialog) {
-            auto *printDialog = qobject_cast<QPrintDialog *>(&dialog);
-            if (!printDialog)
-                return int(QDialog::Rejected);
-            printDialog->printer()->setOutputFormat(QPrinter::PdfFormat);
-            printDialog->printer()->setOutputFileName(pdf);
-            return int(QDialog::Accepted);
-        });
+        PrintToPdf accept(pdf);
         QVERIFY(printer.print());
         QVERIFY(isPdf(pdf));
         QVERIFY(printer.document()->toPlainText().contains("Colour table"));

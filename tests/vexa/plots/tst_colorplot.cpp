@@ -701,6 +701,19 @@ void tst_ColorPlot::wheelZoomHasLowerBound()
     QCOMPARE(view->zoom(), 2.0);
 }
 
+namespace {
+
+// A middle-button drag on the view's viewport from `from` by `by` pixels.
+void dragWithMiddleButton(ZoomGraphicsView *view, const QPoint &from, const QPoint &by)
+{
+    QTest::mousePress(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from);
+    QMouseEvent move(QEvent::MouseMove, QPointF(from + by), Qt::NoButton, Qt::MiddleButton, Qt::NoModifier);
+    QApplication::sendEvent(view->viewport(), &move);
+    QTest::mouseRelease(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from + by);
+}
+
+} // namespace
+
 void tst_ColorPlot::dragPansTheView()
 {
     Page page = makePage();
@@ -712,11 +725,7 @@ void tst_ColorPlot::dragPansTheView()
     QVERIFY(view->setZoom(4.0));
     const QPoint start = view->viewport()->rect().center();
     const QPointF before = view->mapToScene(start);
-    const QPoint from = start + QPoint(0, 60);
-    QTest::mousePress(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from);
-    QMouseEvent move(QEvent::MouseMove, QPointF(from + QPoint(-30, -20)), Qt::NoButton, Qt::MiddleButton, Qt::NoModifier);
-    QApplication::sendEvent(view->viewport(), &move);
-    QTest::mouseRelease(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from + QPoint(-30, -20));
+    dragWithMiddleButton(view, start + QPoint(0, 60), QPoint(-30, -20));
     const QPointF after = view->mapToScene(start);
     // The content moved with the cursor: the view now looks 30 px right and 20 px down of before.
     const double scale = view->transform().m11();
@@ -734,13 +743,7 @@ void tst_ColorPlot::panningWorksAtTheInitialZoom()
     ZoomGraphicsView *view = plot->view();
     QCOMPARE(view->zoom(), 1.0);
     const QPointF fitCentre = view->fitRect().center();
-    auto drag = [view](const QPoint &by) {
-        const QPoint from = view->viewport()->rect().center();
-        QTest::mousePress(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from);
-        QMouseEvent move(QEvent::MouseMove, QPointF(from + by), Qt::NoButton, Qt::MiddleButton, Qt::NoModifier);
-        QApplication::sendEvent(view->viewport(), &move);
-        QTest::mouseRelease(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from + by);
-    };
+    auto drag = [view](const QPoint &by) { dragWithMiddleButton(view, view->viewport()->rect().center(), by); };
     const QPoint middle = view->viewport()->rect().center();
     const QPointF before = view->mapToScene(middle);
     drag(QPoint(-40, 25));
@@ -878,27 +881,13 @@ void tst_ColorPlot::snapshotPrintsThroughTheDialogRunner()
     // The snapshot goes through the same seam as every printed widget: no dialog opens.
     QTemporaryDir dir;
     const QString pdf = dir.filePath(QStringLiteral("snapshot.pdf"));
-    int shown = 0;
-    QString title;
-    QWidget *dialogParent = nullptr;
     bool decorationsRestored = false;
-    RunDialogs print([&](QDialog &dialog) {
-        ++shown;
-        title = dialog.windowTitle();
-        dialogParent = dialog.parentWidget();
-        decorationsRestored = !ab->isPreparedForPrinting();
-        auto *printDialog = qobject_cast<QPrintDialog *>(&dialog);
-        if (!printDialog)
-            return int(QDialog::Rejected);
-        printDialog->printer()->setOutputFormat(QPrinter::PdfFormat);
-        printDialog->printer()->setOutputFileName(pdf);
-        return int(QDialog::Accepted);
-    });
+    PrintToPdf print(pdf, [&](QDialog &) { decorationsRestored = !ab->isPreparedForPrinting(); });
     // The context menu's action prints.
     widget->printSnapshotAction()->trigger();
-    QCOMPARE(shown, 1);
-    QCOMPARE(title, QStringLiteral("Print Visual"));
-    QCOMPARE(dialogParent, &host);
+    QCOMPARE(print.shown, 1);
+    QCOMPARE(print.title, QStringLiteral("Print Visual"));
+    QCOMPARE(print.parent, &host);
     QVERIFY(decorationsRestored); // the snapshot is taken before the dialog is asked
     QVERIFY(QFileInfo(pdf).size() > 500);
 

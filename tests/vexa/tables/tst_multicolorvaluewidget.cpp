@@ -476,14 +476,7 @@ private Q_SLOTS:
 
         // The printed table: the same rows in the same order, every row, through the print dialog.
         const QString pdf = dir.filePath("shown.pdf");
-        RunDialogs print([&pdf](QDialog &dialog) {
-            auto *printDialog = qobject_cast<QPrintDialog *>(&dialog);
-            if (!printDialog)
-                return int(QDialog::Rejected);
-            printDialog->printer()->setOutputFormat(QPrinter::PdfFormat);
-            printDialog->printer()->setOutputFileName(pdf);
-            return int(QDialog::Accepted);
-        });
+        PrintToPdf print(pdf);
         QVERIFY(f.widget.printTable());
         QVERIFY(QFileInfo(pdf).size() > 500);
         auto shown = f.widget.exportModel();
