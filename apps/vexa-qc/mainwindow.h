@@ -15,6 +15,7 @@ class GeneralSettings;
 namespace vexa {
 
 class ComparisonPage;
+class StoreDock;
 class JobDetailViewSettings;
 
 // The comparison workstation: a job chooser, one comparison page, menus for the
@@ -32,6 +33,7 @@ public:
     ComparisonPage *page() const { return m_page; }
     StoreSession *session() const { return m_session; }
     QComboBox *jobBox() const { return m_jobBox; }
+    StoreDock *storeDock() const { return m_storeDock; }
 
     // Message boxes go through here so that headless runs can log them instead.
     // Shows every job grown to this many trials (0: as stored); see enlargeJob().
@@ -57,6 +59,7 @@ private:
     void printTable();
     void printPlotsToPdf();
     void chooseStore();
+    void buildStoreDock();
 
     std::shared_ptr<GeneralSettings> m_generalSettings;
     std::shared_ptr<JobDetailViewSettings> m_viewSettings;
@@ -65,6 +68,7 @@ private:
     QComboBox *m_jobBox;            // Child.
     QLabel *m_statusLabel;          // Child.
     QProgressBar *m_progress;       // Child.
+    StoreDock *m_storeDock;         // Child.
     std::vector<std::shared_ptr<DirEntry>> m_jobs;
     QString m_wantedJob;
     MessageSink m_messageSink;

@@ -11,6 +11,7 @@
 #include <context/serverid.h>
 #include <domain/direntry.h>
 #include <domain/folder.h>
+#include <domain/globaldirentry.h>
 #include <domain/qcjob.h>
 #include <domain/toleranceset.h>
 #include <sampledata/sampledata.h>
@@ -150,7 +151,11 @@ void StoreSession::listJobs()
 
 void StoreSession::loadJob(const std::shared_ptr<DirEntry> &entry)
 {
-    CommandDispatcher *d = dispatcher();
+    // A job picked in another store's browser is read from that store.
+    const auto global = std::dynamic_pointer_cast<GlobalDirEntry>(entry);
+    CommandDispatcher *d = global && !global->dispatcherID().isEmpty()
+        ? m_corvidModel->commandDispatcher(global->dispatcherID().toStdString())
+        : dispatcher();
     if (!d || !entry) {
         Q_EMIT sgError(tr("No object store is open."));
         return;
