@@ -128,12 +128,13 @@ void MetamerismView::refreshAll()
     m_table->setRowCount(0);
     m_table->setColumnCount(columns.size() + tests);
     for (int c = 0; c < columns.size(); ++c) {
-        auto *header = new QTableWidgetItem(tr("ΔE %1").arg(columns[c].toString()));
+        // The illuminant alone: every column shares the page's observer, which the title names.
+        auto *header = new QTableWidgetItem(tr("ΔE %1").arg(columns[c].illuminant()));
         header->setToolTip(tr("Colour difference (%1) under %2").arg(m_formula, columns[c].toString()));
         m_table->setHorizontalHeaderItem(c, header);
     }
     for (int t = 1; t < columns.size(); ++t) {
-        auto *header = new QTableWidgetItem(tr("MI %1").arg(columns[t].toString()));
+        auto *header = new QTableWidgetItem(tr("MI %1").arg(columns[t].illuminant()));
         header->setToolTip(tr("Metamerism index under %1: the difference left after correcting the pair's "
                               "mismatch under %2")
                                .arg(columns[t].toString(), columns[0].toString()));
@@ -151,7 +152,8 @@ void MetamerismView::refreshAll()
         return;
     }
     const QString trialName = UIHelper::trialDisplayString(*trial, QString::fromStdString(data->nameFormat()));
-    m_title->setText(tr("Metamerism of %1 against %2 (ΔE %3)").arg(trialName, standard->name(), m_formula));
+    m_title->setText(tr("Metamerism of %1 against %2 (ΔE %3, %4° observer)")
+                         .arg(trialName, standard->name(), m_formula, columns[0].observer()));
 
     std::set<Geometry> geometries = selection->colorGeometryFilter();
     const bool filtered = !geometries.empty();

@@ -20,7 +20,8 @@ namespace vexa {
 // test illuminant (A and F11 by default, same observer), and the metamerism index under
 // each test illuminant (see ColorIndicesCalculator::MetamerismIndex), which leaves out the
 // part of the difference the pair already has under the page's condition. The row of the
-// selected geometry is bold.
+// selected geometry is bold. The column titles name the illuminants, the title the
+// observer they share.
 class VEXA_EXPORT MetamerismView : public QWidget, public AppearanceViewBase
 {
     Q_OBJECT

@@ -66,13 +66,14 @@ void tst_MetamerismView::columnsPerCondition_data()
     QTest::addColumn<QString>("page");
     QTest::addColumn<QStringList>("tests");
     QTest::addColumn<QStringList>("headers");
+    QTest::addColumn<QString>("observer");
     QTest::newRow("D65 against A and F11") << "D65/10" << QStringList{"A", "F11"}
-                                           << QStringList{"ΔE D65/10", "ΔE A/10", "ΔE F11/10", "MI A/10", "MI F11/10"};
-    QTest::newRow("the page under A") << "A/2" << QStringList{"A", "F11"}
-                                      << QStringList{"ΔE A/2", "ΔE F11/2", "MI F11/2"};
+                                           << QStringList{"ΔE D65", "ΔE A", "ΔE F11", "MI A", "MI F11"} << "10";
+    QTest::newRow("the page under A") << "A/2" << QStringList{"A", "F11"} << QStringList{"ΔE A", "ΔE F11", "MI F11"}
+                                      << "2";
     QTest::newRow("unknown test illuminant") << "D65/10" << QStringList{"X", "D50"}
-                                             << QStringList{"ΔE D65/10", "ΔE D50/10", "MI D50/10"};
-    QTest::newRow("no tests") << "D65/10" << QStringList() << QStringList{"ΔE D65/10"};
+                                             << QStringList{"ΔE D65", "ΔE D50", "MI D50"} << "10";
+    QTest::newRow("no tests") << "D65/10" << QStringList() << QStringList{"ΔE D65"} << "10";
 }
 
 void tst_MetamerismView::columnsPerCondition()
@@ -80,11 +81,15 @@ void tst_MetamerismView::columnsPerCondition()
     QFETCH(QString, page);
     QFETCH(QStringList, tests);
     QFETCH(QStringList, headers);
+    QFETCH(QString, observer);
     m_page.data->setColorimetricCondition(ColorimetricCondition::fromString(page));
     MetamerismView view;
     view.setModels(m_page.data, m_page.selection);
     view.setTestIlluminants(tests);
     QCOMPARE(::headers(view.table()), headers);
+    QVERIFY(view.titleLabel()->text().endsWith(QStringLiteral(", %1° observer)").arg(observer)));
+    for (const ColorimetricCondition &condition : view.conditions())
+        QCOMPARE(condition.observer(), observer);
     QCOMPARE(view.table()->rowCount(), 3);
 }
 
@@ -130,7 +135,8 @@ void tst_MetamerismView::followsSelectionAndFilter()
     QCOMPARE(rows(view.table()), QStringList({"45as15", "45as110"}));
     const double before = view.valueAt(0, 0);
     m_page.data->setColorimetricCondition(ColorimetricCondition(QStringLiteral("D50"), QStringLiteral("2")));
-    QCOMPARE(view.table()->horizontalHeaderItem(0)->text(), QStringLiteral("ΔE D50/2"));
+    QCOMPARE(view.table()->horizontalHeaderItem(0)->text(), QStringLiteral("ΔE D50"));
+    QCOMPARE(view.conditions().front().toString(), QStringLiteral("D50/2"));
     QVERIFY(view.valueAt(0, 0) != before);
 }
 
