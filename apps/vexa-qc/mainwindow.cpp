@@ -21,6 +21,7 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QFileDialog>
+#include <QTimer>
 #include <QFileInfo>
 #include <QLabel>
 #include <QMenuBar>
@@ -216,7 +217,10 @@ void MainWindow::chooseStore()
 void MainWindow::buildStoreDock()
 {
     addDockWidget(Qt::LeftDockWidgetArea, m_storeDock);
-    resizeDocks({m_storeDock}, {400}, Qt::Horizontal);
+    // Narrow by default: the comparison page is the daily work. Sized again once laid out,
+    // since a dock's size before the first layout does not hold.
+    resizeDocks({m_storeDock}, {270}, Qt::Horizontal);
+    QTimer::singleShot(0, this, [this] { resizeDocks({m_storeDock}, {270}, Qt::Horizontal); });
     connect(m_storeDock, &StoreDock::sgObjectActivated, m_storeDock, &StoreDock::openEntry);
     connect(m_storeDock, &StoreDock::sgOpenJob, this, [this](std::shared_ptr<GlobalDirEntry> entry) {
         const int known = m_jobBox->findText(entry->header().name());
