@@ -23,6 +23,7 @@
 #include <QVariant>
 
 #include <algorithm>
+#include <cmath>
 
 namespace vexa {
 
@@ -74,6 +75,29 @@ QColor UIHelper::createColorWithChangedSaturation(const QColor &color, double fa
     QColor changed = color;
     changeSaturation(changed, factor);
     return changed;
+}
+
+double UIHelper::relativeLuminance(const QColor &color)
+{
+    const auto linear = [](double channel) {
+        return channel <= 0.04045 ? channel / 12.92 : std::pow((channel + 0.055) / 1.055, 2.4);
+    };
+    const QColor rgb = color.toRgb();
+    return 0.2126 * linear(rgb.redF()) + 0.7152 * linear(rgb.greenF()) + 0.0722 * linear(rgb.blueF());
+}
+
+double UIHelper::contrastRatio(const QColor &first, const QColor &second)
+{
+    const double a = relativeLuminance(first);
+    const double b = relativeLuminance(second);
+    return (std::max(a, b) + 0.05) / (std::min(a, b) + 0.05);
+}
+
+QColor UIHelper::readableTextColor(const QColor &background)
+{
+    const QColor black(Qt::black);
+    const QColor white(Qt::white);
+    return contrastRatio(background, black) >= contrastRatio(background, white) ? black : white;
 }
 
 QIcon UIHelper::createRGBIcon(const RGBValue &rgb, const QSize &size)
