@@ -93,6 +93,8 @@ const char *const Geometries[] = {Geometry::ANGLE_45asN15, Geometry::ANGLE_45as1
 const double Aspecular[] = {-15, 15, 25, 45, 75, 110};
 // The flop-index limits of the automotive sets: ±FlopLimit.
 constexpr double FlopLimit = 0.5;
+// How much the flop of a metallic trial changes with its sparkle deviation.
+constexpr double FlopPerSparkle = 0.05;
 
 // A paint: base reflectance curve (sum of Gaussians and a sigmoid) and how much
 // metallic flop it has.
@@ -110,13 +112,15 @@ struct Paint
 };
 
 // How a trial departs from its standard: lightness factor, hue shift of the
-// spectral features in nm, chroma factor on the coloured part.
+// spectral features in nm, chroma factor on the coloured part; for metallics the
+// change of sparkle and the factor on the flop that the flakes' alignment brings with it.
 struct Deviation
 {
     double lightness = 1.0;
     double hueShiftNm = 0.0;
     double chroma = 1.0;
     double sparkle = 0.0;
+    double flop = 1.0;
 };
 
 double reflectance(const Paint &p, double nm, double aspecular, const Deviation &d)
@@ -128,7 +132,8 @@ double reflectance(const Paint &p, double nm, double aspecular, const Deviation 
     // Towards the illumination (negative aspecular angles) the flakes reflect less than
     // at the same angle past the specular.
     const double away = aspecular < 0 ? 1.8 * -aspecular : aspecular;
-    const double angular = p.flop > 0 ? (1.0 - p.flop) + p.flop * 2.6 * std::exp(-away / 28.0)
+    const double flop = std::clamp(p.flop * d.flop, 0.0, 1.0);
+    const double angular = p.flop > 0 ? (1.0 - flop) + flop * 2.6 * std::exp(-away / 28.0)
                                       : 1.0 - 0.0006 * away;
     const double value = colour * angular * d.lightness;
     return std::clamp(value, 0.002, 1.5);
@@ -325,6 +330,8 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
                 d.hueShiftNm = 3.0 * scale * dh / norm;
                 d.chroma = 1.0 + 0.06 * scale * dc / norm;
                 d.sparkle = sparkle * std::min(1.0, scale);
+                // Better aligned flakes sparkle more and travel further in lightness.
+                d.flop = 1.0 + FlopPerSparkle * sparkle * scale;
                 return d;
             };
             // Bisection on the scale; n grows with it over this range.

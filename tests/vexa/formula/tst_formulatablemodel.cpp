@@ -53,7 +53,11 @@ class TestFormulaTableModel : public QObject
     Q_OBJECT
 
 private Q_SLOTS:
-    void initTestCase() { QLocale::setDefault(QLocale::c()); }
+    void initTestCase()
+    {
+        QLocale::setDefault(QLocale::c());
+        qRegisterMetaType<Qt::Orientation>();
+    }
 
     void shouldPassTheModelTester()
     {
