@@ -93,7 +93,7 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     tables->addWidget(m_flop);
     tables->setStretchFactor(0, 3);
     tables->setStretchFactor(1, 1);
-    tables->setSizes({760, 300});
+    tables->setSizes({700, 380});
 
     m_plot = new ColorPlotWidget(views);
     m_plot->setObjectName(QStringLiteral("colorPlot"));

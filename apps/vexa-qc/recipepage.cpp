@@ -29,6 +29,7 @@ RecipePage::RecipePage(std::shared_ptr<RecipeWidgetSettings> settings, QWidget *
     setObjectName(QStringLiteral("recipePage"));
     m_list->setObjectName(QStringLiteral("recipeList"));
     m_list->setIconSize(QSize(16, 16));
+    m_list->setMinimumWidth(210);
 
     auto *listBox = new QGroupBox(tr("Formulas"), this);
     auto *listLayout = new QVBoxLayout(listBox);
@@ -39,7 +40,7 @@ RecipePage::RecipePage(std::shared_ptr<RecipeWidgetSettings> settings, QWidget *
     splitter->addWidget(m_formulaWidget);
     splitter->setStretchFactor(0, 0);
     splitter->setStretchFactor(1, 1);
-    splitter->setSizes({240, 1000});
+    splitter->setSizes({200, 1100});
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(6, 6, 6, 6);
     layout->addWidget(splitter);

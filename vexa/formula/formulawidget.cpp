@@ -55,6 +55,7 @@ FormulaWidget::FormulaWidget(std::shared_ptr<RecipeWidgetSettings> settings, QWi
     m_trialList = new QListWidget(this);
     m_trialList->setObjectName(QStringLiteral("recipeTrialList"));
     m_trialList->setIconSize(QSize(16, 16));
+    m_trialList->setMinimumWidth(290);
 
     auto *right = new QWidget(this);
     auto *rightLayout = new QVBoxLayout(right);
@@ -95,7 +96,7 @@ FormulaWidget::FormulaWidget(std::shared_ptr<RecipeWidgetSettings> settings, QWi
     splitter->addWidget(right);
     splitter->setStretchFactor(0, 0);
     splitter->setStretchFactor(1, 1);
-    splitter->setSizes({200, 700});
+    splitter->setSizes({240, 760});
     auto *layout = new QHBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->addWidget(splitter);

@@ -75,7 +75,9 @@ FlopTableWidget::FlopTableWidget(std::shared_ptr<GeneralSettings> generalSetting
     m_view->verticalHeader()->hide();
     m_view->verticalHeader()->setDefaultSectionSize(25);
     m_view->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    m_view->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
+    // The names take what the numbers leave.
+    m_view->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
+    m_view->horizontalHeader()->setSectionResizeMode(FlopTableModel::NameColumn, QHeaderView::Stretch);
     m_view->horizontalHeader()->setHighlightSections(false);
 
     auto *layout = new QVBoxLayout(this);

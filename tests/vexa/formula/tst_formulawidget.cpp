@@ -2,6 +2,7 @@
 // chooser and can size, the restriction editor, copying, and the persisted settings.
 
 #include "formulafixtures.h"
+#include "samplestore.h"
 
 #include <vexa/formula/formulasortmodel.h>
 #include <vexa/formula/formulatable.h>
@@ -14,6 +15,7 @@
 #include <QApplication>
 #include <QClipboard>
 #include <QComboBox>
+#include <QDir>
 #include <QDoubleSpinBox>
 #include <QGroupBox>
 #include <QLabel>
@@ -231,6 +233,45 @@ private Q_SLOTS:
         m_widget->table()->setCurrentIndex(m_widget->sortModel()->index(0, 1));
         QTest::keyClick(m_widget->table(), Qt::Key_Down);
         QCOMPARE(m_widget->table()->currentIndex().row(), 1);
+    }
+
+    // The sample data's silver metallic correction in a 500 g can; with VEXA_SCREENSHOT_DIR
+    // set the picture is kept for the documentation.
+    void shouldShowTheSampleCorrection()
+    {
+        samplestore::SampleStore store;
+        QVERIFY2(store.error.isEmpty(), qPrintable(store.error));
+        std::shared_ptr<RecipeTrial> correction;
+        for (const auto &trial : store.all<RecipeTrial>())
+            if (trial->name() == "Silver Metallic Correction 1")
+                correction = trial;
+        QVERIFY(correction && correction->previousRecipeTrial());
+        QCOMPARE(correction->previousRecipeTrial()->name(), QStringLiteral("Silver Metallic Recipe"));
+
+        FormulaWidget widget(std::make_shared<RecipeWidgetSettings>());
+        widget.setRecipeTrials({correction->previousRecipeTrial(), correction});
+        widget.setUnit(FormulaUnits::Gram);
+        widget.setCanSize(500.0);
+        widget.setViewMode(FormulaWidget::ViewMode::Correction);
+        widget.resize(1320, 340);
+        widget.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&widget));
+        FormulaTableModel *model = widget.tableModel();
+        // 500 g of 61 / 25.5 / 12.5 / 1 after 500 g of 62 / 24 / 12.5 / 1.5: the carbon black
+        // bounds the batch (7.5 g at 1 %), so 750 g in all.
+        const int name = model->columnOfKind(Kind::Colorant);
+        for (int r = 0; r < model->rowCount(); ++r) {
+            if (model->index(r, name).data().toString() == "Carbon Black") {
+                QCOMPARE(model->index(r, model->columnOfKind(Kind::AddAmount)).data().toString(), QStringLiteral("0.00"));
+                QCOMPARE(model->index(r, model->columnOfKind(Kind::CorrectedAmount)).data().toString(),
+                         QStringLiteral("7.50"));
+            }
+            if (model->index(r, name).data().toString() == "Fine Aluminium")
+                QCOMPARE(model->index(r, model->columnOfKind(Kind::AddAmount)).data().toString(), QStringLiteral("71.25"));
+        }
+        const QString target = qEnvironmentVariable("VEXA_SCREENSHOT_DIR");
+        if (!target.isEmpty())
+            QVERIFY(widget.grab().save(QDir(target).filePath("formula-correction.png")));
     }
 
     void shouldPersistTheSettings()
