@@ -75,9 +75,15 @@ FlopTableWidget::FlopTableWidget(std::shared_ptr<GeneralSettings> generalSetting
     m_view->verticalHeader()->hide();
     m_view->verticalHeader()->setDefaultSectionSize(25);
     m_view->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    // The names take what the numbers leave.
-    m_view->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
-    m_view->horizontalHeader()->setSectionResizeMode(FlopTableModel::NameColumn, QHeaderView::Stretch);
+    // The names take what the numbers leave. The number columns are as wide as their
+    // headers: sizing them to their contents would compute every row's flop index.
+    QHeaderView *header = m_view->horizontalHeader();
+    header->setSectionResizeMode(QHeaderView::Interactive);
+    header->setSectionResizeMode(FlopTableModel::NameColumn, QHeaderView::Stretch);
+    for (int column : {int(FlopTableModel::FlopDifferenceColumn), int(FlopTableModel::FlopColumn)}) {
+        const QString text = m_model->headerData(column, Qt::Horizontal).toString();
+        header->resizeSection(column, header->fontMetrics().horizontalAdvance(text) + 24);
+    }
     m_view->horizontalHeader()->setHighlightSections(false);
 
     auto *layout = new QVBoxLayout(this);
