@@ -438,15 +438,20 @@ bool storeRestriction(QMap<int, double> &map, int row, double value)
 
 } // namespace
 
-bool FormulaTableModel::setLoading(int row, double value)
+void FormulaTableModel::restrictionEdited(int row)
 {
-    if (!colorantAt(row) || !storeRestriction(m_loading, row, value))
-        return false;
     writeRestrictions(row);
     const int column = columnOfKind(Kind::Restrictions);
     if (column >= 0)
         Q_EMIT dataChanged(index(row, column), index(row, column));
     Q_EMIT restrictionsChanged();
+}
+
+bool FormulaTableModel::setLoading(int row, double value)
+{
+    if (!colorantAt(row) || !storeRestriction(m_loading, row, value))
+        return false;
+    restrictionEdited(row);
     return true;
 }
 
@@ -454,11 +459,7 @@ bool FormulaTableModel::setConstantAmount(int row, double value)
 {
     if (!colorantAt(row) || !storeRestriction(m_constant, row, value))
         return false;
-    writeRestrictions(row);
-    const int column = columnOfKind(Kind::Restrictions);
-    if (column >= 0)
-        Q_EMIT dataChanged(index(row, column), index(row, column));
-    Q_EMIT restrictionsChanged();
+    restrictionEdited(row);
     return true;
 }
 
@@ -477,11 +478,7 @@ bool FormulaTableModel::setRatio(int row, double value, const std::shared_ptr<Co
     }
     if (!changed)
         return false;
-    writeRestrictions(row);
-    const int column = columnOfKind(Kind::Restrictions);
-    if (column >= 0)
-        Q_EMIT dataChanged(index(row, column), index(row, column));
-    Q_EMIT restrictionsChanged();
+    restrictionEdited(row);
     return true;
 }
 

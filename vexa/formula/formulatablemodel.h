@@ -163,6 +163,8 @@ private:
     void recomputeAndNotify();
     void readRestrictions();
     void writeRestrictions(int row);
+    // Writes the row's restrictions back and tells the views.
+    void restrictionEdited(int row);
     bool isRow(int row) const { return row >= 0 && row < int(m_rows.size()); }
     QString displayText(int row, ColumnKind kind) const;
     QString headerText(ColumnKind kind) const;

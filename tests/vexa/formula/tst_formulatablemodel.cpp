@@ -250,11 +250,14 @@ private Q_SLOTS:
     void shouldShowRawPreviousConcentrationsWhenThePreviousTotalIsZero()
     {
         formulafixtures::Colorants c;
-        const auto first = formulafixtures::recipeTrial("First", formulafixtures::formula("First", {{c.clear, 0.0}}));
+        // A total of 0 (a correction entered as +5/−5): no division, the concentrations as they are.
+        const auto first = formulafixtures::recipeTrial(
+            "First", formulafixtures::formula("First", {{c.clear, 5.0}, {c.fine, -5.0}}));
         const auto second = formulafixtures::recipeTrial(
             "Second", formulafixtures::formula("Second", {{c.clear, 80.0}, {c.fine, 20.0}}), first);
         auto model = makeModel(second);
-        QCOMPARE(column(*model, model->columnOfKind(Kind::PreviousPercent)), (QStringList{"0.00", "0.00"}));
+        QCOMPARE(column(*model, model->columnOfKind(Kind::PreviousPercent)), (QStringList{"5.00", "-5.00"}));
+        QCOMPARE(column(*model, model->columnOfKind(Kind::DifferencePercent)), (QStringList{"75.00", "25.00"}));
         QCOMPARE(column(*model, model->columnOfKind(Kind::FormulaPercent)), (QStringList{"80.00", "20.00"}));
     }
 
