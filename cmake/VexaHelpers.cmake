@@ -67,6 +67,8 @@ function(vexa_add_test name)
     target_link_libraries(${name} PRIVATE ${ARG_LIBS} Qt5::Test)
     target_compile_definitions(${name} PRIVATE QT_FORCE_ASSERTS
         VEXA_SOURCE_DIR="${PROJECT_SOURCE_DIR}")
+    # Shared fixtures: #include <common/...>.
+    target_include_directories(${name} PRIVATE "${PROJECT_SOURCE_DIR}/tests")
     add_test(NAME ${name} COMMAND ${name})
     if(NOT ARG_TIMEOUT)
         set(ARG_TIMEOUT 120)

@@ -32,7 +32,7 @@ PACKAGES=(
     qtbase5-dev qtbase5-dev-tools libqt5sql5-sqlite libqt5svg5-dev
     qttools5-dev qttools5-dev-tools
     liblcms2-dev libxlsxwriter-dev libbenchmark-dev libsqlite3-dev
-    python3-openpyxl xvfb xauth
+    python3-openpyxl python3-pil xvfb xauth
 )
 
 missing=()

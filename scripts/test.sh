@@ -23,6 +23,7 @@ while [[ $# -gt 0 ]]; do
 done
 
 "$ROOT/scripts/setup.sh" --build-dir "$BUILD_DIR" "${SETUP_ARGS[@]}"
+"$ROOT/scripts/check-test-tools.sh"
 
 export QT_QPA_PLATFORM=offscreen
 export ASAN_OPTIONS="${ASAN_OPTIONS:-detect_leaks=0:abort_on_error=1}"

@@ -4,6 +4,7 @@
 #include "storesession.h"
 
 #include <vexa/export/xlsxdocument.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <domain/direntry.h>
 #include <domain/qcjob.h>
@@ -11,6 +12,7 @@
 #include <domain/tolerance.h>
 #include <domain/toleranceset.h>
 #include <domain/trial.h>
+#include <tolerances/tolerancefactory.h>
 #include <utilities/timehelper.h>
 
 #include <QEventLoop>
@@ -25,16 +27,7 @@ namespace {
 
 QColor verdictColour(int status)
 {
-    switch (status) {
-    case 1:
-        return QColor("#00914d");
-    case 2:
-        return QColor("#F2E000");
-    case 3:
-        return QColor("#FF3D35");
-    default:
-        return QColor();
-    }
+    return VerdictColors::colorOfStatus(status);
 }
 
 // Loads the job through the same store session the workstation uses, waiting in a local loop.
@@ -97,6 +90,15 @@ int runBatchJudge(const QString &storePath, const QString &jobName, const QStrin
     JobJudge judge(loaded.job, condition);
     if (!judge.toleranceSet()) {
         err << "The job \"" << jobName << "\" has no tolerance set to judge against.\n";
+        return 2;
+    }
+    // A tolerance that cannot judge (a negative limit, a check threshold above pass) gives no
+    // verdict: the job cannot be judged, and the line must hear why.
+    const QStringList toleranceErrors = ToleranceFactory::toleranceFactory()->validationErrors(*judge.toleranceSet());
+    if (!toleranceErrors.isEmpty()) {
+        err << "The tolerance set \"" << judge.toleranceSet()->name() << "\" cannot judge:\n";
+        for (const QString &error : toleranceErrors)
+            err << "  " << error << "\n";
         return 2;
     }
     const auto verdicts = judge.judge();

@@ -15,6 +15,7 @@
 #include <vexa/tables/multicolorvaluetablemodel.h>
 #include <vexa/tables/multicolorvaluewidget.h>
 #include <vexa/tolerance/toleranceselector.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <colorimetry/colordifferencecalculator.h>
 #include <domain/appearancevalues.h>
@@ -22,9 +23,11 @@
 #include <domain/qcjob.h>
 #include <domain/qcjobtemplate.h>
 #include <domain/standard.h>
+#include <domain/toleranceset.h>
 #include <domain/trial.h>
 #include <settings/generalsettings.h>
 #include <settings/stringlistsetting.h>
+#include <tolerances/tolerancefactory.h>
 
 #include <QComboBox>
 #include <QFormLayout>
@@ -52,14 +55,13 @@ QString metricForFormula(const QString &formula)
 
 QIcon verdictIcon(int status)
 {
-    static const QColor colours[] = {QColor(0xc8, 0xc8, 0xc8), QColor("#00914d"), QColor("#F2E000"),
-                                     QColor("#FF3D35")};
+    const QColor verdict = VerdictColors::colorOfStatus(status);
     QPixmap pixmap(12, 12);
     pixmap.fill(Qt::transparent);
     QPainter painter(&pixmap);
     painter.setRenderHint(QPainter::Antialiasing);
     painter.setPen(QPen(QColor(60, 60, 60), 1));
-    painter.setBrush(colours[qBound(0, status, 3)]);
+    painter.setBrush(verdict.isValid() ? verdict : QColor(0xc8, 0xc8, 0xc8));
     painter.drawEllipse(QRectF(1.5, 1.5, 9, 9));
     return QIcon(pixmap);
 }
@@ -93,7 +95,7 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     tables->addWidget(m_flop);
     tables->setStretchFactor(0, 3);
     tables->setStretchFactor(1, 1);
-    tables->setSizes({700, 380});
+    tables->setSizes({740, 340});
 
     m_plot = new ColorPlotWidget(views);
     m_plot->setObjectName(QStringLiteral("colorPlot"));
@@ -181,6 +183,14 @@ QWidget *ComparisonPage::buildControls()
     QComboBox *tolerances = m_toleranceSelector->createComboBox(conditionBox);
     tolerances->setObjectName(QStringLiteral("toleranceBox"));
     form->addRow(tr("Tolerance set"), tolerances);
+    // Labels above their fields: the panel is narrow, and a label beside a combo box would be cut.
+    form->setRowWrapPolicy(QFormLayout::WrapAllRows);
+    m_toleranceWarning = new QLabel(conditionBox);
+    m_toleranceWarning->setObjectName(QStringLiteral("toleranceWarning"));
+    m_toleranceWarning->setWordWrap(true);
+    m_toleranceWarning->setStyleSheet(QStringLiteral("color: #b00000;"));
+    m_toleranceWarning->setVisible(false);
+    form->addRow(m_toleranceWarning);
     layout->addWidget(conditionBox, 0);
 
     connect(m_trialList, &QListWidget::itemChanged, this, &ComparisonPage::onTrialItemChanged);
@@ -342,6 +352,12 @@ void ComparisonPage::updateVerdictIcons()
         return;
     JobJudge judge(m_dataModel->qcJob(), m_dataModel->colorimetricCondition());
     const auto set = m_dataModel->currentToleranceSet();
+    // A set that cannot judge gives no verdicts; the page says why instead of showing grey dots.
+    const QStringList problems = set ? ToleranceFactory::toleranceFactory()->validationErrors(*set) : QStringList();
+    m_toleranceWarning->setText(problems.isEmpty() ? QString()
+                                                   : tr("This tolerance set gives no verdicts:\n%1")
+                                                         .arg(problems.join(QLatin1Char('\n'))));
+    m_toleranceWarning->setVisible(!problems.isEmpty());
     const auto verdicts = judge.judge(set);
     for (int i = 0; i < m_trialList->count() && i < int(verdicts.size()); ++i) {
         QListWidgetItem *item = m_trialList->item(i);

@@ -47,6 +47,8 @@ public:
     ColorPlotWidget *plotWidget() const { return m_plot; }
     QListWidget *trialList() const { return m_trialList; }
     QListWidget *geometryList() const { return m_geometryList; }
+    // Says why the tolerance set in force gives no verdicts; hidden when it can judge.
+    QLabel *toleranceWarning() const { return m_toleranceWarning; }
 
     // The view settings changed (settings dialog): every view re-reads them.
     void settingsChanged();
@@ -75,6 +77,7 @@ private:
     QComboBox *m_conditionBox = nullptr;
     QComboBox *m_formulaBox = nullptr;
     ToleranceSelector *m_toleranceSelector = nullptr;
+    QLabel *m_toleranceWarning = nullptr;
     MultiColorValueWidget *m_table = nullptr;
     FlopTableWidget *m_flop = nullptr;
     ColorPlotWidget *m_plot = nullptr;

@@ -93,7 +93,12 @@ int main(int argc, char **argv)
     QCommandLineOption conditionOption(QStringLiteral("condition"),
                                        QStringLiteral("Batch mode: the colorimetric condition (default D65/10)."),
                                        QStringLiteral("CONDITION"), QStringLiteral("D65/10"));
-    parser.addOptions({storeOption, jobOption, pageOption, screenshotOption, judgeOption, xlsxOption, conditionOption});
+    QCommandLineOption trialsOption(QStringLiteral("trials"),
+                                    QStringLiteral("Show the job grown to N trials (its own, repeated with small "
+                                                   "changes; in memory only), for demonstrations and measurements."),
+                                    QStringLiteral("N"));
+    parser.addOptions({storeOption, jobOption, pageOption, screenshotOption, judgeOption, xlsxOption, conditionOption,
+                       trialsOption});
     parser.process(app);
 
     const QString storePath = parser.isSet(storeOption) ? parser.value(storeOption) : StoreSession::defaultStorePath();
@@ -117,6 +122,7 @@ int main(int argc, char **argv)
     auto generalSettings = SettingsManager::instance().getGeneralSettings();
 
     MainWindow window(generalSettings, viewSettings, recipeSettings);
+    window.setTrialCount(parser.value(trialsOption).toInt());
     if (!window.showPage(parser.value(pageOption))) {
         err << "--page must be comparison or recipe\n";
         return 2;

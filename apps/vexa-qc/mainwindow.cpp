@@ -1,6 +1,7 @@
 #include "mainwindow.h"
 
 #include "comparisonpage.h"
+#include "demojob.h"
 #include "recipepage.h"
 
 #include <vexa/export/widgetprinter.h>
@@ -130,8 +131,11 @@ void MainWindow::onJobChosen(int index)
     m_session->loadJob(m_jobs[size_t(index)]);
 }
 
-void MainWindow::onJobLoaded(const LoadedJob &job)
+void MainWindow::onJobLoaded(const LoadedJob &loaded)
 {
+    LoadedJob job = loaded;
+    if (m_trialCount > 0)
+        enlargeJob(job, m_trialCount);
     m_page->showJob(job);
     m_statusLabel->setText(tr("%1 — %2 objects from %3")
                                .arg(m_jobBox->currentText())
@@ -197,9 +201,10 @@ void MainWindow::exportExcel()
     m_statusLabel->setText(tr("Ready"));
 }
 
+// The whole table as the view shows it (sorted, shown columns), not only the rows in view.
 void MainWindow::printTable()
 {
-    m_page->tableWidget()->print();
+    m_page->tableWidget()->printTable();
 }
 
 void MainWindow::printPlotsToPdf()

@@ -45,6 +45,9 @@ public:
     QComboBox *jobBox() const { return m_jobBox; }
 
     // Message boxes go through here so that headless runs can log them instead.
+    // Shows every job grown to this many trials (0: as stored); see enlargeJob().
+    void setTrialCount(int trials) { m_trialCount = trials; }
+
     using MessageSink = std::function<void(const QString &title, const QString &text)>;
     void setMessageSink(MessageSink sink) { m_messageSink = std::move(sink); }
 
@@ -81,6 +84,7 @@ private:
     std::vector<std::shared_ptr<DirEntry>> m_jobs;
     QString m_wantedJob;
     MessageSink m_messageSink;
+    int m_trialCount = 0;
 };
 
 } // namespace vexa

@@ -14,9 +14,11 @@
 #include <domain/formula.h>
 #include <domain/qcjob.h>
 #include <domain/recipetrial.h>
+#include <domain/toleranceset.h>
 #include <sampledata/sampledata.h>
 #include <store/errorinfo.h>
 #include <store/objectstore.h>
+#include <tolerances/tolerancefactory.h>
 #include <utilities/logger.h>
 
 #include <QCoreApplication>
@@ -215,6 +217,12 @@ void StoreSession::loadJob(const std::shared_ptr<DirEntry> &entry)
             if (!loaded.job) {
                 Q_EMIT sgError(tr("%1 is not a QC job.").arg(entry->header().name()));
                 return;
+            }
+            // Sets as stored may carry values that follow from others (box limits the wrong way
+            // round, CIE94 factors of another application): fill them in as the editor would.
+            for (const auto &object : objects) {
+                if (auto set = std::dynamic_pointer_cast<ToleranceSet>(object))
+                    ToleranceFactory::toleranceFactory()->recomputeToleranceSet(*set);
             }
             Q_EMIT sgJobLoaded(loaded);
         },

@@ -197,16 +197,91 @@ int runLab(const QStringList &arguments, QTextStream &out, QTextStream &err)
     return failures == 0 ? 0 : 1;
 }
 
+// The weights of a formula, given as "2:1" (CMC l:c) or "1:1:1" (kL:kC:kH); false with a
+// message naming the text when it is not that many positive numbers.
+bool parseFactors(const QString &option, const QString &text, int count, double *factors, QTextStream &err)
+{
+    const QStringList parts = text.split(QLatin1Char(':'));
+    bool ok = parts.size() == count;
+    for (int i = 0; ok && i < count; ++i) {
+        factors[i] = parts.at(i).toDouble(&ok);
+        ok = ok && std::isfinite(factors[i]) && factors[i] > 0.0;
+    }
+    if (!ok)
+        err << option << " wants " << (count == 2 ? "two" : "three") << " positive numbers joined by ':' (got \""
+            << text << "\")\n";
+    return ok;
+}
+
+QString factorText(const double *factors, int count)
+{
+    QStringList parts;
+    for (int i = 0; i < count; ++i)
+        parts << QString::number(factors[i], 'g', 6);
+    return parts.join(QLatin1Char(':'));
+}
+
+// CMC's l:c is 2:1 unless given (the textile and automotive convention: lightness counts half);
+// the other formulas' weights are 1 unless given. The line names the factors it used.
 int runDe(const QStringList &arguments, QTextStream &out, QTextStream &err)
 {
     QStringList args = arguments;
     QString formula = QStringLiteral("CIE2000");
-    if (!takeOption(args, QStringLiteral("--formula"), &formula, err))
+    QString lcText;
+    QString weightsText;
+    QString precisionText = QStringLiteral("4");
+    if (!takeOption(args, QStringLiteral("--formula"), &formula, err)
+        || !takeOption(args, QStringLiteral("--lc"), &lcText, err)
+        || !takeOption(args, QStringLiteral("--weights"), &weightsText, err)
+        || !takeOption(args, QStringLiteral("--precision"), &precisionText, err))
         return 2;
     if (args.size() != 6) {
-        err << "Usage: vexa-tool de L1 a1 b1 L2 a2 b2 [--formula CIE2000]\n";
+        err << "Usage: vexa-tool de L1 a1 b1 L2 a2 b2 [--formula CIE2000] [--lc 2:1] [--weights 1:1:1] "
+               "[--precision 4]\n";
         return 2;
     }
+    bool precisionOk = false;
+    const int precision = precisionText.toInt(&precisionOk);
+    if (!precisionOk || precision < 0 || precision > 15) {
+        err << "--precision wants a number of decimals from 0 to 15 (got \"" << precisionText << "\")\n";
+        return 2;
+    }
+    if (!ColorDifferenceCalculator::isKnownFormula(formula)) {
+        err << "Unknown formula \"" << formula << "\" (known: "
+            << ColorDifferenceCalculator::formulaNames().join(QStringLiteral(", ")) << ")\n";
+        return 2;
+    }
+    const QString kind = formula.trimmed().toUpper();
+    const bool cmc = kind == QLatin1String("CMC");
+    const bool din = kind.startsWith(QLatin1String("DIN99"));
+    const bool cielab = !cmc && !din && kind != QLatin1String("CIE94") && !kind.contains(QLatin1String("2000"));
+    if (!lcText.isEmpty() && !cmc) {
+        err << "--lc sets CMC's l:c; " << formula << " takes --weights\n";
+        return 2;
+    }
+    if (!weightsText.isEmpty() && (cmc || cielab)) {
+        err << "--weights sets kL:kC:kH (CIE94, CIE2000) or kE:kCH (DIN99, DIN99o); "
+            << (cmc ? QStringLiteral("CMC takes --lc") : formula + QStringLiteral(" has none")) << "\n";
+        return 2;
+    }
+    double factors[3] = {1.0, 1.0, 1.0};
+    int factorCount = 3;
+    QString factorNames = QStringLiteral("kL:kC:kH");
+    if (cmc) {
+        factors[0] = 2.0;
+        factorCount = 2;
+        factorNames = QStringLiteral("l:c");
+        if (!lcText.isEmpty() && !parseFactors(QStringLiteral("--lc"), lcText, 2, factors, err))
+            return 2;
+    } else if (din) {
+        factorCount = 2;
+        factorNames = QStringLiteral("kE:kCH");
+    } else if (cielab) {
+        factorCount = 0;
+    }
+    if (!weightsText.isEmpty() && !parseFactors(QStringLiteral("--weights"), weightsText, factorCount, factors, err))
+        return 2;
+
     double v[6];
     for (int i = 0; i < 6; ++i) {
         if (!parseNumber(args.at(i), &v[i], err))
@@ -214,17 +289,15 @@ int runDe(const QStringList &arguments, QTextStream &out, QTextStream &err)
     }
     const LabValue standard(v[0], v[1], v[2]);
     const LabValue trial(v[3], v[4], v[5]);
-    try {
-        const double dE = ColorDifferenceCalculator::Default_DE(formula, standard, trial, 1.0, 1.0, 1.0);
-        out << formula << QStringLiteral(" dE=%1 dL*=%2 dC*=%3 dH*=%4\n")
-                              .arg(dE, 0, 'f', 4)
-                              .arg(ColorDifferenceCalculator::Delta_L(standard, trial), 0, 'f', 4)
-                              .arg(ColorDifferenceCalculator::Delta_C(standard, trial), 0, 'f', 4)
-                              .arg(ColorDifferenceCalculator::Delta_H(standard, trial), 0, 'f', 4);
-    } catch (const std::invalid_argument &e) {
-        err << e.what() << "\n";
-        return 1;
-    }
+    const double dE = ColorDifferenceCalculator::Default_DE(formula, standard, trial, factors[0], factors[1], factors[2]);
+    out << formula;
+    if (factorCount > 0)
+        out << " " << factorNames << "=" << factorText(factors, factorCount);
+    out << QStringLiteral(" dE=%1 dL*=%2 dC*=%3 dH*=%4\n")
+               .arg(dE, 0, 'f', precision)
+               .arg(ColorDifferenceCalculator::Delta_L(standard, trial), 0, 'f', precision)
+               .arg(ColorDifferenceCalculator::Delta_C(standard, trial), 0, 'f', precision)
+               .arg(ColorDifferenceCalculator::Delta_H(standard, trial), 0, 'f', precision);
     return 0;
 }
 
@@ -254,24 +327,34 @@ int runJudge(const QStringList &arguments, QTextStream &out, QTextStream &err)
     ToleranceFactory::toleranceFactory(); // registers the judging rules
     static const char *const verdicts[] = {"no verdict", "PASS", "WARNING", "FAIL"};
     int worst = 0;
+    bool refused = false;
     for (const auto &tolerance : set->tolerances()) {
         const ToleranceJudgement j = tolerance->judge(*trial, *standard, condition);
         out << (tolerance->geometry().isEmpty() ? QStringLiteral("(sample)") : tolerance->geometry()) << " "
             << tolerance->toleranceType() << ": " << verdicts[std::clamp(j.status, 0, 3)];
+        if (!j.error.isEmpty()) {
+            out << "\n";
+            err << j.error << "\n";
+            refused = true;
+            continue;
+        }
         for (int i = 0; i < j.colorDifferences.size() && i < j.differenceNames.size(); ++i)
             out << " " << j.differenceNames.at(i) << "=" << QString::number(j.colorDifferences.at(i), 'f', 3);
         out << "\n";
         worst = std::max(worst, j.status);
     }
     out << "overall: " << verdicts[worst] << "\n";
+    if (refused)
+        return 2; // A tolerance that cannot judge: no verdict for the set.
     return worst == 3 ? 1 : 0;
 }
 
 const VerbRegistrar registrar{
     {QStringLiteral("lab"), QStringLiteral("SPECTRUM_FILE [--condition D65/10]"),
      QStringLiteral("L*a*b* of a spectrum (text \"start interval v1 v2 ...\" or a stored spectrum)"), &runLab},
-    {QStringLiteral("de"), QStringLiteral("L1 a1 b1 L2 a2 b2 [--formula CIE2000]"),
-     QStringLiteral("Colour difference, standard first"), &runDe},
+    {QStringLiteral("de"), QStringLiteral("L1 a1 b1 L2 a2 b2 [--formula CIE2000] [--lc 2:1] [--weights 1:1:1] [--precision 4]"),
+     QStringLiteral("Colour difference, standard first; CMC's l:c is 2:1 unless --lc says otherwise, other weights 1"),
+     &runDe},
     {QStringLiteral("judge"), QStringLiteral("STANDARD TRIAL TOLERANCESET [--condition D65/10]"),
      QStringLiteral("Judge a trial against a standard with a tolerance set, per geometry"), &runJudge},
 };

@@ -50,6 +50,12 @@ bool spectrumToXyz(const ReflectanceSpectrum &spectrum, const ColorimetricCondit
                               .arg(spectrum.startWavelength())
                               .arg(spectrum.wavelengthInterval())
                               .arg(values.size());
+            } else if (weights->unmeasuredShare() > SpectralWeights::maximumUnmeasuredShare) {
+                problem = QStringLiteral("the wavelength grid (%1-%2 nm) leaves %3% of the colour matching weight "
+                                         "of 360-830 nm unmeasured")
+                              .arg(spectrum.startWavelength())
+                              .arg(spectrum.startWavelength() + spectrum.wavelengthInterval() * (values.size() - 1))
+                              .arg(qRound(weights->unmeasuredShare() * 100.0));
             }
         }
     }

@@ -4,6 +4,8 @@
 
 #include <domain/labvalue.h>
 
+#include <utilities/logger.h>
+
 #include <cmath>
 #include <limits>
 #include <stdexcept>
@@ -40,9 +42,20 @@ CieLab toCie(const LabValue &lab)
     return CieLab{lab.l(), lab.a(), lab.b()};
 }
 
+// Both values numbers, and measured under the same illuminant and observer: L*a*b* values of
+// different conditions have different whites and no difference between them means anything.
 bool usable(const LabValue &lab1, const LabValue &lab2)
 {
-    return lab1.isValid() && lab2.isValid();
+    if (!lab1.isValid() || !lab2.isValid())
+        return false;
+    if (lab1.colorimetricCondition() != lab2.colorimetricCondition()) {
+        Logger::instance().warning(LogCategory::Colorimetry,
+                                   QStringLiteral("ColorDifferenceCalculator: no difference between %1 and %2: "
+                                                  "the colorimetric conditions differ")
+                                       .arg(lab1.toString(), lab2.toString()));
+        return false;
+    }
+    return true;
 }
 
 constexpr double kNaN = std::numeric_limits<double>::quiet_NaN();

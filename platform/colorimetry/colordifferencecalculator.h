@@ -12,7 +12,8 @@ class LabValue;
 /// standard (reference), the second the trial; every difference is trial minus standard. CIE94 and CMC
 /// take their weights from the standard; CIEDE2000, DIN99, DIN99o and ΔE*ab are symmetric.
 ///
-/// An invalid value (NaN or infinite component) gives NaN, never a number that looks real.
+/// An invalid value (NaN or infinite component) gives NaN, never a number that looks real; so do
+/// two values under different colorimetric conditions (D65/10 against A/2), with a logged warning.
 class VEXA_COLORIMETRY_EXPORT ColorDifferenceCalculator
 {
 public:

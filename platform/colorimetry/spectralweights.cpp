@@ -130,6 +130,9 @@ std::shared_ptr<const SpectralWeights> SpectralWeights::compute(const QString &i
     // The sum runs over the illuminant's own tabulation (1 nm or 5 nm) where it overlaps the observer
     // (360-830 nm), so no illuminant value is invented by interpolation.
     double normalisation = 0.0;
+    double total[3] = {0.0, 0.0, 0.0};
+    double unmeasured[3] = {0.0, 0.0, 0.0};
+    const double lastMeasured = start + interval * (count - 1);
     const int first = std::max(kFirstWavelength, power.firstWavelength);
     const int last = std::min(kLastWavelength, power.lastWavelength());
     for (int wavelength = first; wavelength <= last; wavelength += power.step) {
@@ -137,8 +140,16 @@ std::shared_ptr<const SpectralWeights> SpectralWeights::compute(const QString &i
         const int row = (wavelength - cmf.firstWavelength) / cmf.step;
         const double product[3] = {s * cmf.value(row, 0), s * cmf.value(row, 1), s * cmf.value(row, 2)};
         normalisation += product[1];
+        const bool outside = wavelength < start || wavelength > lastMeasured;
+        for (int c = 0; c < 3; ++c) {
+            total[c] += product[c];
+            if (outside)
+                unmeasured[c] += product[c];
+        }
         addInterpolated((wavelength - start) / interval, count, product, weights);
     }
+    for (int c = 0; c < 3; ++c)
+        result->m_unmeasuredShare = std::max(result->m_unmeasuredShare, total[c] > 0.0 ? unmeasured[c] / total[c] : 1.0);
     const double k = 100.0 / normalisation;
     for (auto &w : weights) {
         for (double &value : w)

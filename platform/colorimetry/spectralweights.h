@@ -50,6 +50,15 @@ public:
     /// XYZ of R ≡ 1 with these weights.
     const CieXYZ &whitePoint() const { return m_white; }
 
+    /// The largest share, over X, Y and Z, of the colour matching weight (S(λ)·x̄(λ) summed over
+    /// 360-830 nm) that falls outside the measured range and is only extrapolated: 0 for a grid
+    /// covering 360-830 nm, about 0.002 for 400-700 nm, 1 for a grid wholly outside. A colour
+    /// computed from a grid that leaves much of the weight unmeasured is made up, not measured.
+    double unmeasuredShare() const { return m_unmeasuredShare; }
+    /// The share above which a grid gives no colour: 0.1 (420-700 nm still passes with 0.06 of
+    /// Z unmeasured under D65/10; 430-670 nm does not).
+    static constexpr double maximumUnmeasuredShare = 0.1;
+
 private:
     SpectralWeights() = default;
     static std::shared_ptr<const SpectralWeights> compute(const QString &illuminant, const QString &observer,
@@ -59,6 +68,7 @@ private:
     std::vector<double> m_y;
     std::vector<double> m_z;
     CieXYZ m_white;
+    double m_unmeasuredShare = 0.0;
 };
 
 } // namespace vexa

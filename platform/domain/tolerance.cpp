@@ -45,6 +45,20 @@ std::shared_ptr<ToleranceParameter> Tolerance::toleranceParameter(const QString 
     return nullptr;
 }
 
+QString Tolerance::describe() const
+{
+    const QString type = m_toleranceType.isEmpty() ? QStringLiteral("Tolerance") : QStringLiteral("\"%1\"").arg(m_toleranceType);
+    return m_geometry.isEmpty() ? type : QStringLiteral("%1 at %2").arg(type, m_geometry);
+}
+
+QString Tolerance::validationError() const
+{
+    const auto rule = ToleranceRuleRegistry::instance().rule(m_toleranceType);
+    if (!rule)
+        return QStringLiteral("%1: the tolerance type is not known.").arg(describe());
+    return rule->validate(*this);
+}
+
 ToleranceJudgement Tolerance::judge(const AppearanceValues &trial, const AppearanceValues &standard,
                                     const ColorimetricCondition &condition) const
 {
@@ -52,6 +66,12 @@ ToleranceJudgement Tolerance::judge(const AppearanceValues &trial, const Appeara
     if (!rule)
         return ToleranceJudgement();
     try {
+        const QString problem = rule->validate(*this);
+        if (!problem.isEmpty()) {
+            ToleranceJudgement refused;
+            refused.error = problem;
+            return refused;
+        }
         return rule->judge(*this, trial, standard, condition);
     } catch (const std::exception &e) {
         Logger::instance().error(LogCategory::General,

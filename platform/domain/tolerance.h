@@ -47,8 +47,15 @@ public:
     std::shared_ptr<ToleranceValue> toleranceValue(const QString &name) const;
     std::shared_ptr<ToleranceParameter> toleranceParameter(const QString &name) const;
 
+    // "CIEDE2000 at 45as15" (the type alone without a geometry): names the tolerance in messages.
+    QString describe() const;
+    // Why this tolerance cannot judge (unknown type, a limit or threshold out of range), in
+    // words for the user; empty when it can. See ToleranceRule::validate.
+    QString validationError() const;
+
     // Judges the trial's values against the standard's at this tolerance's geometry.
-    // Status 0 when no rule is registered for the type or the rule cannot judge.
+    // Status 0 when no rule is registered for the type or the rule cannot judge; with a
+    // tolerance that cannot judge at all, the judgement's error says why.
     ToleranceJudgement judge(const AppearanceValues &trial, const AppearanceValues &standard,
                              const ColorimetricCondition &condition) const;
     // The status alone: 0 no verdict, 1 pass, 2 warning, 3 fail.

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <QString>
 #include <QStringList>
 #include <QVector>
 #include <QtNumeric>
@@ -18,6 +19,10 @@ struct ToleranceJudgement
     // The colour differences the rule computed, named by differenceNames.
     QVector<double> colorDifferences;
     QStringList differenceNames;
+    // Why the tolerance gave no verdict although it was asked to judge: a limit or threshold
+    // that cannot be used (a negative colour-difference limit, a check threshold above the pass
+    // threshold). Empty when the tolerance could judge or simply lacked values.
+    QString error;
 };
 
 } // namespace vexa

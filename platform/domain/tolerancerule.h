@@ -3,6 +3,8 @@
 #include <domain/domain_export.h>
 #include <domain/tolerancejudgement.h>
 
+#include <QString>
+
 namespace vexa {
 
 class AppearanceValues;
@@ -18,6 +20,10 @@ public:
     virtual ~ToleranceRule();
     virtual ToleranceJudgement judge(const Tolerance &tolerance, const AppearanceValues &trial,
                                      const AppearanceValues &standard, const ColorimetricCondition &condition) const = 0;
+    // Why the tolerance cannot judge at all, in words for the user; empty when it can. The base
+    // checks the thresholds: a pass threshold above 0 and a check threshold from 0 up to it.
+    // Tolerance::judge asks this first and gives no verdict, with this text, when it is not empty.
+    virtual QString validate(const Tolerance &tolerance) const;
 };
 
 } // namespace vexa

@@ -13,6 +13,28 @@ const MemberList &ToleranceSet::staticMembers()
     return list;
 }
 
+void ToleranceSet::setTolerances(const std::vector<std::shared_ptr<Tolerance>> &tolerances)
+{
+    m_tolerances = tolerances;
+    linkParameters();
+}
+
+void ToleranceSet::setToleranceSetParameters(const std::shared_ptr<ToleranceSetParameters> &parameters)
+{
+    m_parameters = parameters;
+    linkParameters();
+}
+
+void ToleranceSet::linkParameters()
+{
+    if (!m_parameters)
+        return;
+    for (const auto &tolerance : m_tolerances) {
+        if (tolerance)
+            tolerance->setToleranceSetParameters(m_parameters);
+    }
+}
+
 std::shared_ptr<Tolerance> ToleranceSet::toleranceWithGeometry(const Geometry &geometry) const
 {
     for (const auto &t : m_tolerances) {

@@ -44,6 +44,33 @@ ColorDifferenceRule::ColorDifferenceRule(Kind kind)
 {
 }
 
+QString ColorDifferenceRule::validate(const Tolerance &tolerance) const
+{
+    const QString thresholds = ToleranceRule::validate(tolerance);
+    if (!thresholds.isEmpty())
+        return thresholds;
+    switch (m_kind) {
+    case Kind::LabBox:
+    case Kind::LChBox: {
+        static const char *const labAxes[] = {"dL", "da", "db"};
+        static const char *const lchAxes[] = {"dL", "dC", "dH"};
+        for (const char *axis : m_kind == Kind::LabBox ? labAxes : lchAxes) {
+            const QString problem = Tools::checkBoxLimits(tolerance, QString::fromLatin1(axis));
+            if (!problem.isEmpty())
+                return problem;
+        }
+        return QString();
+    }
+    case Kind::CIE94:
+        if (Tools::cie94Application(tolerance).name.isEmpty())
+            return QStringLiteral("%1: the application \"%2\" is not known (\"Graphic arts\" or \"Textiles\").")
+                .arg(tolerance.describe(), Tools::text(tolerance, QStringLiteral("Application"), QString()));
+        return Tools::checkDifferenceLimit(tolerance, QStringLiteral("dE"));
+    default:
+        return Tools::checkDifferenceLimit(tolerance, QStringLiteral("dE"));
+    }
+}
+
 ToleranceJudgement ColorDifferenceRule::judge(const Tolerance &tolerance, const AppearanceValues &trial,
                                               const AppearanceValues &standard,
                                               const ColorimetricCondition &condition) const
@@ -87,11 +114,10 @@ ToleranceJudgement ColorDifferenceRule::judge(const Tolerance &tolerance, const 
     case Kind::CIE94: {
         const bool geometricMean = Tools::text(tolerance, QStringLiteral("Chroma reference"), QStringLiteral("Standard"))
                                    == QLatin1String("Geometric mean");
-        r = Formulas::cie94(s, t, Tools::number(tolerance, QStringLiteral("kL"), 1.0),
-                            Tools::number(tolerance, QStringLiteral("kC"), 1.0),
-                            Tools::number(tolerance, QStringLiteral("kH"), 1.0),
-                            Tools::number(tolerance, QStringLiteral("K1"), 0.045),
-                            Tools::number(tolerance, QStringLiteral("K2"), 0.015),
+        // kL, K1 and K2 follow the application, whatever numbers the set carries.
+        const Tools::Cie94Application application = Tools::cie94Application(tolerance);
+        r = Formulas::cie94(s, t, application.kL, Tools::number(tolerance, QStringLiteral("kC"), 1.0),
+                            Tools::number(tolerance, QStringLiteral("kH"), 1.0), application.K1, application.K2,
                             geometricMean ? Formulas::ChromaReference::GeometricMean
                                           : Formulas::ChromaReference::Standard);
         names = QStringList{QStringLiteral("dE94"), QStringLiteral("dL/(kL SL)"), QStringLiteral("dC/(kC SC)"),

@@ -18,6 +18,7 @@ public:
 
     ToleranceJudgement judge(const Tolerance &tolerance, const AppearanceValues &trial,
                              const AppearanceValues &standard, const ColorimetricCondition &condition) const override;
+    QString validate(const Tolerance &tolerance) const override;
 
 private:
     Kind m_kind;

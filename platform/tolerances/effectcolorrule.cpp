@@ -36,6 +36,12 @@ EffectColorRule::EffectColorRule(bool audi)
 {
 }
 
+QString EffectColorRule::validate(const Tolerance &tolerance) const
+{
+    const QString thresholds = ToleranceRule::validate(tolerance);
+    return thresholds.isEmpty() ? Tools::checkDifferenceLimit(tolerance, QStringLiteral("dE")) : thresholds;
+}
+
 EffectColorRule::Result EffectColorRule::evaluate(const Tolerance &tolerance, const CieLab &standard,
                                                   const CieLab &trial, double gamma)
 {

@@ -35,6 +35,7 @@ public:
 
     ToleranceJudgement judge(const Tolerance &tolerance, const AppearanceValues &trial,
                              const AppearanceValues &standard, const ColorimetricCondition &condition) const override;
+    QString validate(const Tolerance &tolerance) const override;
 
 private:
     bool m_audi;

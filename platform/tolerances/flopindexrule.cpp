@@ -15,6 +15,12 @@
 
 namespace vexa {
 
+QString FlopIndexRule::validate(const Tolerance &tolerance) const
+{
+    const QString thresholds = ToleranceRule::validate(tolerance);
+    return thresholds.isEmpty() ? ToleranceRuleTools::checkBoxLimits(tolerance, QStringLiteral("dFI")) : thresholds;
+}
+
 ToleranceJudgement FlopIndexRule::judge(const Tolerance &tolerance, const AppearanceValues &trial,
                                         const AppearanceValues &standard, const ColorimetricCondition &condition) const
 {

@@ -14,6 +14,7 @@ class VEXA_TOLERANCES_EXPORT FlopIndexRule : public ToleranceRule
 public:
     ToleranceJudgement judge(const Tolerance &tolerance, const AppearanceValues &trial,
                              const AppearanceValues &standard, const ColorimetricCondition &condition) const override;
+    QString validate(const Tolerance &tolerance) const override;
 };
 
 } // namespace vexa

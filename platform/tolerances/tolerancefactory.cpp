@@ -1,8 +1,10 @@
 #include <tolerances/tolerancefactory.h>
 
+#include <tolerances/boxlimit.h>
 #include <tolerances/colordifferencerule.h>
 #include <tolerances/effectcolorrule.h>
 #include <tolerances/flopindexrule.h>
+#include <tolerances/toleranceruletools.h>
 #include <tolerances/tolerancetypes.h>
 
 #include <domain/parameterchoice.h>
@@ -23,8 +25,6 @@ using Type = ToleranceParameter::ParameterType;
 using Parameters = std::vector<std::shared_ptr<ToleranceParameter>>;
 using Values = std::vector<std::shared_ptr<ToleranceValue>>;
 namespace T = ToleranceTypes;
-
-const QString kApplied = QStringLiteral("Applied application");
 
 std::shared_ptr<ToleranceValue> limitValue(const QString &name, double value)
 {
@@ -109,20 +109,39 @@ const QVector<Geometry> &effectGeometries()
     return geometries;
 }
 
+// The CIE94 factors shown follow the application in force (the set-wide one rules); the rule
+// itself never reads the stored numbers, so a stale number cannot change a verdict.
 void applyCie94Application(Tolerance &tolerance)
 {
-    const auto application = tolerance.toleranceParameter(QStringLiteral("Application"));
-    const auto applied = tolerance.toleranceParameter(kApplied);
-    if (!application || !applied || application->value().toString() == applied->value().toString())
-        return;
-    const bool textiles = application->value().toString() == QLatin1String("Textiles");
-    if (const auto kL = tolerance.toleranceParameter(QStringLiteral("kL")))
-        kL->setValue(textiles ? 2.0 : 1.0);
-    if (const auto k1 = tolerance.toleranceParameter(QStringLiteral("K1")))
-        k1->setValue(textiles ? 0.048 : 0.045);
-    if (const auto k2 = tolerance.toleranceParameter(QStringLiteral("K2")))
-        k2->setValue(textiles ? 0.014 : 0.015);
-    applied->setValue(application->value());
+    const ToleranceRuleTools::Cie94Application application = ToleranceRuleTools::cie94Application(tolerance);
+    if (application.name.isEmpty())
+        return; // Unknown: validation says so; nothing to fill in.
+    if (const auto own = tolerance.toleranceParameter(QStringLiteral("Application")))
+        own->setValue(application.name);
+    const std::pair<const char *, double> factors[] = {
+        {"kL", application.kL}, {"K1", application.K1}, {"K2", application.K2}};
+    for (const auto &factor : factors) {
+        if (const auto parameter = tolerance.toleranceParameter(QString::fromLatin1(factor.first)))
+            parameter->setValue(factor.second);
+    }
+}
+
+// A limit pair typed the wrong way round is stored the right way round.
+void orderBoxLimits(Tolerance &tolerance)
+{
+    for (const auto &value : tolerance.toleranceValues()) {
+        if (!value || !value->name().endsWith(QLatin1Char('-')))
+            continue;
+        const QString axis = value->name().chopped(1);
+        const auto upper = tolerance.toleranceValue(axis + QLatin1Char('+'));
+        if (!upper)
+            continue;
+        double low = value->valueAsDouble();
+        double high = upper->valueAsDouble();
+        BoxLimit::order(&low, &high);
+        value->setValue(low);
+        upper->setValue(high);
+    }
 }
 
 } // namespace
@@ -224,17 +243,14 @@ std::shared_ptr<Tolerance> ToleranceFactory::createTolerance(const QString &tole
             parameters.push_back(choice(QStringLiteral("Application"), QStringLiteral("Graphic arts"),
                                         {{QStringLiteral("Graphic arts"), QStringLiteral("Graphic arts")},
                                          {QStringLiteral("Textiles"), QStringLiteral("Textiles")}}));
+            // kL follows the application: shown, not edited.
             weights({{"kL", 1.0}, {"kC", 1.0}, {"kH", 1.0}});
+            parameters[1]->setIsEditable(false);
             parameters.push_back(choice(QStringLiteral("Chroma reference"), QStringLiteral("Standard"),
                                         {{QStringLiteral("Standard"), QStringLiteral("Standard")},
                                          {QStringLiteral("Geometric mean"), QStringLiteral("Geometric mean")}}));
             parameters.push_back(number(QStringLiteral("K1"), 0.045, false));
             parameters.push_back(number(QStringLiteral("K2"), 0.015, false));
-            auto applied = std::make_shared<ToleranceParameter>(kApplied, kApplied, Type::Text,
-                                                                QStringLiteral("Graphic arts"));
-            applied->setIsVisible(false);
-            applied->setIsEditable(false);
-            parameters.push_back(applied);
         } else if (toleranceType == T::CMC) {
             weights({{"l", 2.0}, {"c", 1.0}});
         } else if (toleranceType == T::CIEDE2000) {
@@ -276,10 +292,30 @@ std::shared_ptr<ToleranceSet> ToleranceFactory::createToleranceSet(const QString
 
 void ToleranceFactory::recomputeToleranceSet(ToleranceSet &toleranceSet) const
 {
+    // Re-links the tolerances to the set's parameters (a set assembled by hand may not be).
+    toleranceSet.setTolerances(toleranceSet.tolerances());
     for (const auto &tolerance : toleranceSet.tolerances()) {
-        if (tolerance && tolerance->toleranceType() == T::CIE94)
+        if (!tolerance)
+            continue;
+        orderBoxLimits(*tolerance);
+        if (tolerance->toleranceType() == T::CIE94)
             applyCie94Application(*tolerance);
     }
+}
+
+QStringList ToleranceFactory::validationErrors(const ToleranceSet &toleranceSet) const
+{
+    QStringList errors;
+    if (toleranceSet.tolerances().empty())
+        errors << QStringLiteral("The tolerance set \"%1\" holds no tolerance.").arg(toleranceSet.name());
+    for (const auto &tolerance : toleranceSet.tolerances()) {
+        if (!tolerance)
+            continue;
+        const QString problem = tolerance->validationError();
+        if (!problem.isEmpty())
+            errors << problem;
+    }
+    return errors;
 }
 
 std::shared_ptr<ToleranceSet> ToleranceFactory::recomputeToleranceSet(std::shared_ptr<ToleranceSet> toleranceSet) const

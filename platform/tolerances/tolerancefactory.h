@@ -41,6 +41,9 @@ public:
                                                      const QVector<Geometry> &geometries = {}) const;
     /// Rewrites the values that follow from others, in place (see the slot of the same name).
     void recomputeToleranceSet(ToleranceSet &toleranceSet) const;
+    /// Why tolerances of the set cannot judge (one line each, naming type and geometry), and an
+    /// empty set; empty when every tolerance can judge.
+    QStringList validationErrors(const ToleranceSet &toleranceSet) const;
 
 public Q_SLOTS:
     /// A new tolerance of the type with its default limits and parameters, at `geometry` (empty
@@ -50,8 +53,10 @@ public Q_SLOTS:
                                                              const vexa::Geometry &geometry = vexa::Geometry()) const;
     /// The geometries a type supports; empty for the sample-wide flop index and unknown types.
     virtual QVector<vexa::Geometry> supportedGeometries(const QString &toleranceType) const;
-    /// Fills in what depends on edited values (CIE94: the "Application" choice sets kL, K1, K2 when it
-    /// changed). Returns the same set.
+    /// Fills in what depends on edited values, in place: the tolerances see the set's own
+    /// parameters; box limit pairs typed the wrong way round are put the right way round; CIE94's
+    /// kL, K1 and K2 follow the "Application" in force (the set-wide one rules over a tolerance's
+    /// own: "Graphic arts" 1, 0.045, 0.015; "Textiles" 2, 0.048, 0.014). Returns the same set.
     virtual std::shared_ptr<vexa::ToleranceSet> recomputeToleranceSet(std::shared_ptr<vexa::ToleranceSet> toleranceSet) const;
 
 protected:

@@ -58,6 +58,51 @@ bool ToleranceRuleTools::labPair(const AppearanceValues &standard, const Appeara
     return true;
 }
 
+ToleranceRuleTools::Cie94Application ToleranceRuleTools::cie94Application(const Tolerance &tolerance)
+{
+    const QString key = QStringLiteral("Application");
+    std::shared_ptr<ToleranceParameter> parameter;
+    if (const auto setParameters = tolerance.toleranceSetParameters())
+        parameter = setParameters->parameter(key);
+    if (!parameter)
+        parameter = tolerance.toleranceParameter(key);
+    Cie94Application application;
+    application.name = parameter ? parameter->value().toString() : QStringLiteral("Graphic arts");
+    if (application.name == QLatin1String("Textiles")) {
+        application.kL = 2.0;
+        application.K1 = 0.048;
+        application.K2 = 0.014;
+    } else if (application.name != QLatin1String("Graphic arts")) {
+        application.name.clear();
+    }
+    return application;
+}
+
+QString ToleranceRuleTools::checkDifferenceLimit(const Tolerance &tolerance, const QString &name)
+{
+    const auto value = tolerance.toleranceValue(name);
+    if (!value)
+        return QString();
+    const double limit = value->valueAsDouble();
+    if (!std::isfinite(limit))
+        return QStringLiteral("%1: the limit %2 is not a number.").arg(tolerance.describe(), name);
+    if (limit < 0.0)
+        return QStringLiteral("%1: the limit %2 is negative (%3); a colour-difference limit must be 0 or more.")
+            .arg(tolerance.describe(), name, QString::number(limit));
+    return QString();
+}
+
+QString ToleranceRuleTools::checkBoxLimits(const Tolerance &tolerance, const QString &axis)
+{
+    for (const QChar side : {QLatin1Char('-'), QLatin1Char('+')}) {
+        const QString name = axis + side;
+        const auto value = tolerance.toleranceValue(name);
+        if (value && !std::isfinite(value->valueAsDouble()))
+            return QStringLiteral("%1: the limit %2 is not a number.").arg(tolerance.describe(), name);
+    }
+    return QString();
+}
+
 void ToleranceRuleTools::conclude(const Tolerance &tolerance, double n, ToleranceJudgement *judgement)
 {
     judgement->normalizedDifference = n;

@@ -32,6 +32,11 @@ void Logger::debug(LogCategory category, const QString &message)
     write(LogLevel::Debug, category, message);
 }
 
+void Logger::warning(LogCategory category, const QString &message)
+{
+    write(LogLevel::Warning, category, message);
+}
+
 void Logger::error(LogCategory category, const QString &message)
 {
     write(LogLevel::Error, category, message);
@@ -67,6 +72,8 @@ void Logger::write(LogLevel level, LogCategory category, const QString &message)
         const QString line = QStringLiteral("[%1] %2").arg(logCategoryName(category), message);
         if (level == LogLevel::Error)
             qCritical().noquote() << line;
+        else if (level == LogLevel::Warning)
+            qWarning().noquote() << line;
         else
             qDebug().noquote() << line;
     }

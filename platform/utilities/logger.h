@@ -18,7 +18,7 @@ enum class LogCategory {
 
 VEXA_UTILITIES_EXPORT QString logCategoryName(LogCategory category);
 
-enum class LogLevel { Debug, Error };
+enum class LogLevel { Debug, Warning, Error };
 
 // A sink for log lines. Implementations must be thread-safe: the store and the
 // plot workers log from their own threads.
@@ -37,6 +37,9 @@ public:
     static Logger &instance();
 
     void debug(LogCategory category, const QString &message);
+    // Something was refused or left out, and the caller carries on (a comparison of values
+    // that are not comparable, say).
+    void warning(LogCategory category, const QString &message);
     void error(LogCategory category, const QString &message);
 
     // The logger does not own the sink; unregister it before it dies.

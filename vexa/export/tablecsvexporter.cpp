@@ -1,6 +1,7 @@
 #include <vexa/export/tablecsvexporter.h>
 
 #include <vexa/export/savefileprompt.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <settings/generalsettings.h>
 
@@ -27,32 +28,18 @@ QString TableCSVExporter::exportDelimiter() const
     return m_settings ? m_settings->exportDelimiter() : QStringLiteral(";");
 }
 
-QString TableCSVExporter::backgroundText(const QVariant &background)
+QString TableCSVExporter::effectiveDelimiter(const QLocale &locale) const
 {
-    switch (background.userType()) {
-    case QMetaType::QColor: {
-        const QColor color = background.value<QColor>();
-        return color.isValid() ? color.name() : QString();
-    }
-    case QMetaType::QBrush: {
-        const QBrush brush = background.value<QBrush>();
-        return brush.style() == Qt::NoBrush ? QString() : brush.color().name();
-    }
-    default:
-        return background.toString();
-    }
+    const QString delimiter = exportDelimiter();
+    const QString decimal(locale.decimalPoint());
+    if (delimiter != decimal)
+        return delimiter;
+    return decimal == QLatin1String(";") ? QStringLiteral("\t") : QStringLiteral(";");
 }
 
 QString TableCSVExporter::verdictOfBackground(const QVariant &background)
 {
-    const QString text = backgroundText(background);
-    if (text == QLatin1String("#00914d"))
-        return tr("PASS");
-    if (text == QLatin1String("#ff3d35"))
-        return tr("FAIL");
-    if (text == QLatin1String("#f2e000"))
-        return tr("WARNING");
-    return QString();
+    return VerdictColors::word(VerdictColors::statusOfBackground(background));
 }
 
 QString TableCSVExporter::exportToString(std::shared_ptr<QAbstractTableModel> model) const
@@ -64,7 +51,7 @@ QString TableCSVExporter::exportToString(const QAbstractItemModel *model) const
 {
     if (!model)
         return QString();
-    const QString delimiter = exportDelimiter();
+    const QString delimiter = effectiveDelimiter();
     const int columns = model->columnCount();
     const int rows = model->rowCount();
     QString text;
@@ -115,6 +102,7 @@ bool TableCSVExporter::writeToFile(const QString &text, const QString &fileName)
     }
     QTextStream stream(&file);
     stream.setCodec("UTF-8");
+    stream.setGenerateByteOrderMark(true);
     stream << text;
     stream.flush();
     if (stream.status() != QTextStream::Ok || !file.flush()) {

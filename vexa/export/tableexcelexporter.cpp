@@ -1,7 +1,7 @@
 #include <vexa/export/tableexcelexporter.h>
 
-#include <vexa/export/tablecsvexporter.h>
 #include <vexa/export/xlsxdocument.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <QAbstractTableModel>
 #include <QColor>
@@ -71,8 +71,9 @@ bool TableExcelExporter::exportToSelectedSheet(int &row, QList<QModelIndex> sele
             const QModelIndex index = model->index(r, c);
             XlsxFormat format;
             const QVariant background = model->data(index, Qt::BackgroundRole);
-            if (!TableCSVExporter::verdictOfBackground(background).isEmpty())
-                format.setPatternBackgroundColor(QColor(TableCSVExporter::backgroundText(background)));
+            const int verdict = VerdictColors::statusOfBackground(background);
+            if (verdict != 0)
+                format.setPatternBackgroundColor(VerdictColors::colorOfStatus(verdict));
             QVariant value = model->data(index, kExportValueRole);
             if (!value.isValid())
                 value = model->data(index, Qt::DisplayRole);

@@ -23,6 +23,15 @@ bool readsAsNumber(const QString &text)
     return ok;
 }
 
+// Every text goes into the page as text: a trial named "<b>A & B" prints as it is named.
+// Line breaks of header texts stay line breaks.
+QString escaped(const QString &text)
+{
+    QString html = text.toHtmlEscaped();
+    html.replace(QLatin1Char('\n'), QStringLiteral("<br>"));
+    return html;
+}
+
 } // namespace
 
 TablePrinter::TablePrinter(std::shared_ptr<QSortFilterProxyModel> model, QObject *parent)
@@ -54,7 +63,7 @@ QString TablePrinter::html() const
         if (title->empty())
             continue;
         anyTitle = true;
-        html += QStringLiteral("<caption style=\"font-weight:bold\">") + QString::fromStdString(*title)
+        html += QStringLiteral("<caption style=\"font-weight:bold\">") + escaped(QString::fromStdString(*title))
             + QStringLiteral("</caption>");
     }
     if (!anyTitle)
@@ -64,7 +73,7 @@ QString TablePrinter::html() const
         const int columns = m_model->columnCount();
         html += QStringLiteral("<tr>");
         for (int c = 0; c < columns; ++c)
-            html += QStringLiteral("<th>") + m_model->headerData(c, Qt::Horizontal, Qt::DisplayRole).toString()
+            html += QStringLiteral("<th>") + escaped(m_model->headerData(c, Qt::Horizontal, Qt::DisplayRole).toString())
                 + QStringLiteral("</th>");
         html += QStringLiteral("</tr>");
         const int rows = m_model->rowCount();
@@ -74,7 +83,7 @@ QString TablePrinter::html() const
                 const QString text = m_model->data(m_model->index(r, c), Qt::DisplayRole).toString();
                 html += (c >= 2 && readsAsNumber(text)) ? QStringLiteral("<td align=\"right\">")
                                                         : QStringLiteral("<td align=\"left\">");
-                html += text + QStringLiteral("</td>");
+                html += escaped(text) + QStringLiteral("</td>");
             }
             html += QStringLiteral("</tr>");
         }
@@ -82,7 +91,7 @@ QString TablePrinter::html() const
 
     if (!m_total.empty())
         html += QStringLiteral("<tr><th>") + tr("Total:") + QStringLiteral("</th><td align=\"left\">")
-            + QString::fromStdString(m_total) + QStringLiteral("</td></tr>");
+            + escaped(QString::fromStdString(m_total)) + QStringLiteral("</td></tr>");
     html += QStringLiteral("</table></body></html>");
     return html;
 }

@@ -29,8 +29,11 @@ public:
     // Empty means no total line.
     void setTotal(const std::string &total);
 
-    // The document text built from the model's current state.
+    // The document text built from the model's current state. Every text (titles, headers,
+    // cells, total) is escaped: a name such as "<b>A & B" prints as it is written.
     QString html() const;
+    // Fills document() from the model's current state (what print and preview do first).
+    void buildDocument();
     QTextDocument *document() const { return m_document; }
 
     // Shows a print dialog (through DialogRunner); prints only when it is accepted.
@@ -46,8 +49,6 @@ public Q_SLOTS:
     void printDocument(QPrinter *printer);
 
 private:
-    void buildDocument();
-
     std::string m_title1;
     std::string m_title2;
     std::string m_title3;

@@ -3,6 +3,7 @@
 #include <vexa/export/dialogrunner.h>
 
 #include <QFile>
+#include <QImage>
 #include <QPainter>
 #include <QPrintDialog>
 #include <QPrinter>
@@ -47,18 +48,56 @@ bool WidgetPrinter::render(QWidget *widget, QPrinter &printer)
     return true;
 }
 
+bool WidgetPrinter::render(const QImage &image, QPrinter &printer)
+{
+    if (image.isNull())
+        return false;
+    const QRectF page = printer.pageLayout().paintRectPixels(printer.resolution());
+    const double scale = scaleFactor(page, image.size());
+    if (scale <= 0.0)
+        return false;
+    QPainter painter;
+    if (!painter.begin(&printer))
+        return false;
+    painter.setRenderHint(QPainter::SmoothPixmapTransform, true);
+    painter.scale(scale, scale);
+    painter.drawImage(QPoint(0, 0), image);
+    painter.end();
+    return true;
+}
+
+namespace {
+
+// The print dialog every widget and snapshot print goes through.
+bool askForPrinter(QPrinter &printer, QWidget *dialogParent)
+{
+    preparePrinter(printer);
+    QPrintDialog dialog(&printer, dialogParent);
+    dialog.setObjectName(QStringLiteral("widgetPrintDialog"));
+    dialog.setWindowTitle(WidgetPrinter::tr("Print Visual"));
+    return DialogRunner::exec(dialog) == QDialog::Accepted;
+}
+
+} // namespace
+
 bool WidgetPrinter::printWidget(QWidget *widget)
 {
     if (!widget)
         return false;
     QPrinter printer(QPrinter::HighResolution);
-    preparePrinter(printer);
-    QPrintDialog dialog(&printer, widget->parentWidget());
-    dialog.setObjectName(QStringLiteral("widgetPrintDialog"));
-    dialog.setWindowTitle(tr("Print Visual"));
-    if (DialogRunner::exec(dialog) != QDialog::Accepted)
+    if (!askForPrinter(printer, widget->parentWidget()))
         return false;
     return render(widget, printer);
+}
+
+bool WidgetPrinter::printImage(const QImage &image, QWidget *parent)
+{
+    if (image.isNull())
+        return false;
+    QPrinter printer(QPrinter::HighResolution);
+    if (!askForPrinter(printer, parent ? parent->parentWidget() : nullptr))
+        return false;
+    return render(image, printer);
 }
 
 bool WidgetPrinter::printWidgetToPdf(QWidget *widget, const QString &fileName)

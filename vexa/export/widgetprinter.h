@@ -7,6 +7,7 @@
 #include <QSize>
 #include <QString>
 
+class QImage;
 class QPrinter;
 class QWidget;
 
@@ -23,6 +24,11 @@ public:
     static bool printWidget(QWidget *widget);
     // Writes the widget as a one-page PDF file without asking.
     static bool printWidgetToPdf(QWidget *widget, const QString &fileName);
+    // Prints a picture taken of a widget (a snapshot) the same way: the dialog "Print Visual"
+    // through DialogRunner, scaled to fit one A4 page. True when something was printed.
+    static bool printImage(const QImage &image, QWidget *parent);
+    // Paints the picture on the printer, scaled to its page. False when painting cannot start.
+    static bool render(const QImage &image, QPrinter &printer);
 
     // The factor that fits a widget of that size into the page rectangle (one factor for
     // both axes); 0 for an empty widget.

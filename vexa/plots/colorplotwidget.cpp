@@ -1,22 +1,17 @@
 #include <vexa/plots/colorplotwidget.h>
 
+#include <vexa/export/widgetprinter.h>
 #include <vexa/plots/plotwidget.h>
 #include <vexa/plots/zoomgraphicsview.h>
 
 #include <QAction>
-#include <QFileDialog>
 #include <QHBoxLayout>
 #include <QMenu>
-#include <QPainter>
-#include <QPrintDialog>
-#include <QPrinter>
-#include <QPrinterInfo>
 
 namespace vexa {
 
 ColorPlotWidget::ColorPlotWidget(QWidget *parent)
     : QWidget(parent)
-    , m_snapshotPrinter(&ColorPlotWidget::printWithDialog)
 {
 }
 
@@ -82,11 +77,6 @@ void ColorPlotWidget::onContextMenuRequested(const QPoint &position)
     m_contextMenu->popup(source ? source->mapToGlobal(position) : mapToGlobal(position));
 }
 
-void ColorPlotWidget::setSnapshotPrinter(SnapshotPrinter printer)
-{
-    m_snapshotPrinter = printer ? std::move(printer) : SnapshotPrinter(&ColorPlotWidget::printWithDialog);
-}
-
 QImage ColorPlotWidget::snapshot()
 {
     for (PlotWidget *plot : {m_abPlot, m_lPlot}) {
@@ -101,50 +91,9 @@ QImage ColorPlotWidget::snapshot()
     return image;
 }
 
-void ColorPlotWidget::print()
+bool ColorPlotWidget::print()
 {
-    const QImage image = snapshot();
-    if (image.isNull())
-        return;
-    m_snapshotPrinter(image, this);
-}
-
-bool ColorPlotWidget::printImage(const QImage &image, QPrinter &printer)
-{
-    if (image.isNull())
-        return false;
-    QPainter painter;
-    if (!painter.begin(&printer))
-        return false;
-    const QRect page = painter.viewport();
-    QSize size = image.size();
-    size.scale(page.size(), Qt::KeepAspectRatio);
-    const QRect target(page.x() + (page.width() - size.width()) / 2, page.y(), size.width(), size.height());
-    painter.setRenderHint(QPainter::SmoothPixmapTransform, true);
-    painter.drawImage(target, image);
-    return painter.end();
-}
-
-void ColorPlotWidget::printWithDialog(const QImage &snapshot, QWidget *parent)
-{
-    if (QPrinterInfo::availablePrinters().isEmpty()) {
-        const QString file = QFileDialog::getSaveFileName(parent, tr("Save Snapshot"), QString(),
-                                                          tr("PDF files (*.pdf)"));
-        if (file.isEmpty())
-            return;
-        QPrinter printer(QPrinter::HighResolution);
-        printer.setOutputFormat(QPrinter::PdfFormat);
-        printer.setOutputFileName(file.endsWith(QLatin1String(".pdf"), Qt::CaseInsensitive)
-                                      ? file
-                                      : file + QStringLiteral(".pdf"));
-        printImage(snapshot, printer);
-        return;
-    }
-    QPrinter printer(QPrinter::HighResolution);
-    QPrintDialog dialog(&printer, parent);
-    dialog.setWindowTitle(tr("Print Snapshot"));
-    if (dialog.exec() == QDialog::Accepted)
-        printImage(snapshot, printer);
+    return WidgetPrinter::printImage(snapshot(), this);
 }
 
 } // namespace vexa

@@ -25,6 +25,16 @@ QVector<QRectF> LabColorPlotGraphicsView::directionMarkerRects() const
     };
 }
 
+QMarginsF LabColorPlotGraphicsView::fitMargins() const
+{
+    // Kept whether the bars show or not (a snapshot hides them), so the layout stays put.
+    // Each bar is 1/100 of the visible size thick, centred on an edge of the viewport less
+    // 10 pixels at the right and the bottom: keep its inner half and a pixel more free.
+    const double halfX = viewport()->width() / 200.0 + 2.0;
+    const double halfY = viewport()->height() / 200.0 + 2.0;
+    return QMarginsF(halfX, halfY, 10.0 + halfX, 10.0 + halfY);
+}
+
 void LabColorPlotGraphicsView::drawForeground(QPainter *painter, const QRectF &rect)
 {
     ZoomGraphicsView::drawForeground(painter, rect);

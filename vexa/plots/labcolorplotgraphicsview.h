@@ -6,7 +6,8 @@ namespace vexa {
 
 // The view of the a*b* plots: on top of the scene it marks the four directions of the plane
 // at the middle of each edge of what is visible: -a* green (left), +a* red (right), +b*
-// yellow (top), -b* blue (bottom).
+// yellow (top), -b* blue (bottom). At the initial zoom the scene (tick labels included) is
+// fitted into the part of the viewport the bars leave free, so no bar covers a label.
 class VEXA_EXPORT LabColorPlotGraphicsView : public ZoomGraphicsView
 {
     Q_OBJECT
@@ -21,6 +22,7 @@ public:
 
 protected:
     void drawForeground(QPainter *painter, const QRectF &rect) override;
+    QMarginsF fitMargins() const override;
 
 private:
     bool m_directionMarkers = true;

@@ -141,6 +141,7 @@ void PlotWidget::initialize(ZoomGraphicsView *view, const QRect &sceneRect, cons
     view->setFitRect(m_scene->sceneRect(),
                      m_plane == Plane::AB ? Qt::KeepAspectRatio : Qt::IgnoreAspectRatio);
     connect(m_scene, &QGraphicsScene::selectionChanged, this, &PlotWidget::onSelectionChanged);
+    connect(view, &ZoomGraphicsView::sgTransformChanged, this, &PlotWidget::placeStandardLabel);
     if (appearanceViewDataModel())
         refreshAll();
 }
@@ -157,6 +158,8 @@ TextItem *PlotWidget::addStandardLabel()
     m_standardLabel->setOffset(7);
     m_standardLabel->setZValue(10);
     m_standardLabel->setVisible(false);
+    // Clicks go through to the markers under the label.
+    m_standardLabel->setAcceptedMouseButtons(Qt::NoButton);
     m_scene->addItem(m_standardLabel);
     return m_standardLabel;
 }
@@ -433,6 +436,7 @@ void PlotWidget::rebuildScene()
         }
         buildStandard();
         buildTrials();
+        placeStandardLabel();
     }
     if (m_toleranceGroup)
         m_toleranceGroup->setTransform(valueToScene());
@@ -634,11 +638,44 @@ void PlotWidget::buildStandard()
         const auto model = appearanceViewDataModel();
         const QString name = model && model->standard() ? model->standard()->name() : QString();
         m_standardLabel->setText(name);
-        m_standardLabel->setBackground(m_standardColor);
+        // Translucent, so that a marker under the label still shows.
+        QColor box = m_standardColor;
+        box.setAlpha(190);
+        m_standardLabel->setBackground(box);
         m_standardLabel->setTextColor(labelColorFor(m_standardColor));
         m_standardLabel->setPos(position);
         m_standardLabel->setVisible(!name.isEmpty());
     }
+}
+
+void PlotWidget::placeStandardLabel()
+{
+    if (!m_standardLabel || !m_standardLabel->isVisible() || !m_view)
+        return;
+    const QPointF anchor = m_view->mapFromScene(m_standardLabel->pos());
+    const double reach = TrialGraphicsItem::Radius + 2.0;
+    const Qt::Alignment sides[] = {Qt::AlignLeft | Qt::AlignBottom, Qt::AlignRight | Qt::AlignBottom,
+                                   Qt::AlignLeft | Qt::AlignTop, Qt::AlignRight | Qt::AlignTop};
+    Qt::Alignment best = sides[0];
+    int fewest = -1;
+    for (const Qt::Alignment side : sides) {
+        m_standardLabel->setAlignment(side);
+        // The label ignores the view's transformations: its rectangle is in viewport pixels.
+        const QRectF covered =
+            m_standardLabel->boundingRect().translated(anchor).adjusted(-reach, -reach, reach, reach);
+        int count = 0;
+        for (const TrialGraphicsItem *item : qAsConst(m_trialItems)) {
+            if (covered.contains(m_view->mapFromScene(item->pos())))
+                ++count;
+        }
+        if (fewest < 0 || count < fewest) {
+            fewest = count;
+            best = side;
+        }
+        if (count == 0)
+            break;
+    }
+    m_standardLabel->setAlignment(best);
 }
 
 void PlotWidget::buildTrials()

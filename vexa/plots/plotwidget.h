@@ -162,6 +162,9 @@ private:
     void buildHueCircle();
     void buildStandard();
     void buildTrials();
+    // Puts the standard's label on the side of the standard where it covers the fewest trial
+    // markers (up-right, up-left, down-right, down-left, in that order of preference).
+    void placeStandardLabel();
     void requestToleranceShape();
     void clearToleranceItems();
     void refreshSelection();

@@ -35,7 +35,8 @@ void TrialGraphicsItem::setVerdictColor(const QColor &color)
 
 QRectF TrialGraphicsItem::boundingRect() const
 {
-    const double r = Radius + 4.0;
+    // Room for the selected marker's halo (radius + 1.5 + 3.5, and half its pen).
+    const double r = Radius + 6.0;
     const double w = m_shape == Shape::Bar ? BarHalfWidth + 2.0 : r;
     return QRectF(-w, -r, 2 * w, 2 * r);
 }
@@ -71,7 +72,20 @@ void TrialGraphicsItem::paint(QPainter *painter, const QStyleOptionGraphicsItem 
         halo.setCosmetic(true);
         painter->setPen(halo);
         painter->setBrush(Qt::NoBrush);
-        painter->drawEllipse(QPointF(0, 0), r + 2.5, r + 2.5);
+        painter->drawEllipse(QPointF(0, 0), r + 3.5, r + 3.5);
+    }
+    // A dark edge and a light one around the verdict ring: the marker stands out on a light
+    // tint and on a dark one, whatever the trial's own colour.
+    if (enabled) {
+        QPen light(QColor(255, 255, 255, 210), 1.0);
+        light.setCosmetic(true);
+        painter->setPen(light);
+        painter->setBrush(Qt::NoBrush);
+        painter->drawEllipse(QPointF(0, 0), r + 2.0, r + 2.0);
+        QPen dark(QColor(25, 25, 25), 1.0);
+        dark.setCosmetic(true);
+        painter->setPen(dark);
+        painter->drawEllipse(QPointF(0, 0), r + 1.0, r + 1.0);
     }
     QPen pen(ring, 2.0);
     pen.setCosmetic(true);

@@ -2,9 +2,9 @@
 
 #include <QGraphicsItem>
 #include <QMouseEvent>
-#include <QScrollBar>
 #include <QWheelEvent>
 
+#include <algorithm>
 #include <cmath>
 
 namespace vexa {
@@ -34,30 +34,63 @@ void ZoomGraphicsView::setFitRect(const QRectF &rect, Qt::AspectRatioMode mode)
     m_fitRect = rect;
     m_aspectMode = mode;
     m_zoom = 1.0;
-    setSceneRect(rect);
+    setSceneRect(panArea());
     applyTransform(rect.center());
+}
+
+QRectF ZoomGraphicsView::panArea() const
+{
+    return m_fitRect.adjusted(-m_fitRect.width(), -m_fitRect.height(), m_fitRect.width(), m_fitRect.height());
+}
+
+QMarginsF ZoomGraphicsView::fitMargins() const
+{
+    return QMarginsF(2, 2, 2, 2);
+}
+
+QRectF ZoomGraphicsView::freeArea() const
+{
+    return QRectF(viewport()->rect()).marginsRemoved(fitMargins());
+}
+
+void ZoomGraphicsView::panBy(const QPoint &viewDelta)
+{
+    if (!m_fitRect.isValid())
+        return;
+    const QTransform inverse = transform().inverted();
+    const QPointF sceneDelta = inverse.map(QPointF(viewDelta)) - inverse.map(QPointF(0, 0));
+    applyTransform(m_centre - sceneDelta);
 }
 
 void ZoomGraphicsView::applyTransform(const QPointF &sceneCentre)
 {
-    if (!m_fitRect.isValid() || viewport()->width() <= 0 || viewport()->height() <= 0)
+    if (!m_fitRect.isValid())
         return;
-    const QRectF viewRect = viewport()->rect().adjusted(2, 2, -2, -2);
+    const QRectF area = panArea();
+    m_centre = QPointF(std::clamp(sceneCentre.x(), area.left(), area.right()),
+                       std::clamp(sceneCentre.y(), area.top(), area.bottom()));
+    if (viewport()->width() <= 0 || viewport()->height() <= 0)
+        return;
+    const QRectF viewRect = freeArea();
+    if (viewRect.width() <= 0 || viewRect.height() <= 0)
+        return;
     double sx = viewRect.width() / m_fitRect.width();
     double sy = viewRect.height() / m_fitRect.height();
     if (m_aspectMode != Qt::IgnoreAspectRatio)
         sx = sy = std::min(sx, sy);
     setTransform(QTransform::fromScale(sx * m_zoom, sy * m_zoom));
-    centerOn(sceneCentre);
+    // m_centre sits at the middle of the free area, which may lie off the viewport's middle.
+    const QPointF offset = QRectF(viewport()->rect()).center() - viewRect.center();
+    centerOn(m_centre + QPointF(offset.x() / (sx * m_zoom), offset.y() / (sy * m_zoom)));
+    Q_EMIT sgTransformChanged();
 }
 
 bool ZoomGraphicsView::setZoom(double zoom)
 {
     if (!(zoom > ZoomFloor) || !std::isfinite(zoom))
         return false;
-    const QPointF centre = mapToScene(viewport()->rect().center());
     m_zoom = zoom;
-    applyTransform(zoom == 1.0 ? m_fitRect.center() : centre);
+    applyTransform(zoom == 1.0 ? m_fitRect.center() : m_centre);
     Q_EMIT sgZoomChanged(m_zoom);
     return true;
 }
@@ -74,11 +107,11 @@ bool ZoomGraphicsView::zoomBy(double factor, const QPointF &viewPosition)
     const double newZoom = factor * m_zoom;
     if (!(newZoom > ZoomFloor) || !std::isfinite(newZoom))
         return false;
-    const QPointF anchor = mapToScene(viewPosition.toPoint());
-    const QPointF centre = mapToScene(viewport()->rect().center());
+    const QTransform inverse = transform().inverted();
+    const QPointF anchor = m_centre + inverse.map(viewPosition - freeArea().center()) - inverse.map(QPointF(0, 0));
     m_zoom = newZoom;
     // The anchor stays under the cursor: the centre moves towards it by the scale change.
-    const QPointF newCentre = anchor + (centre - anchor) / factor;
+    const QPointF newCentre = anchor + (m_centre - anchor) / factor;
     applyTransform(newCentre);
     Q_EMIT sgZoomChanged(m_zoom);
     return true;
@@ -113,8 +146,7 @@ void ZoomGraphicsView::mouseMoveEvent(QMouseEvent *event)
     if (m_panning) {
         const QPoint delta = event->pos() - m_lastPanPosition;
         m_lastPanPosition = event->pos();
-        horizontalScrollBar()->setValue(horizontalScrollBar()->value() - delta.x());
-        verticalScrollBar()->setValue(verticalScrollBar()->value() - delta.y());
+        panBy(delta);
         event->accept();
         return;
     }
@@ -134,9 +166,8 @@ void ZoomGraphicsView::mouseReleaseEvent(QMouseEvent *event)
 
 void ZoomGraphicsView::resizeEvent(QResizeEvent *event)
 {
-    const QPointF centre = m_zoom == 1.0 ? m_fitRect.center() : mapToScene(viewport()->rect().center());
     QGraphicsView::resizeEvent(event);
-    applyTransform(centre);
+    applyTransform(m_centre);
 }
 
 } // namespace vexa

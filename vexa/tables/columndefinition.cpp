@@ -1,5 +1,7 @@
 #include <vexa/tables/columndefinition.h>
 
+#include <vexa/widgets/verdictcolors.h>
+
 #include <vexa/tables/appearanceviewtablemodelrow.h>
 #include <vexa/tables/multicolorvaluetablemodel.h>
 
@@ -216,30 +218,23 @@ ColumnDefinitionToleranceSet::ColumnDefinitionToleranceSet(const std::shared_ptr
 
 const QColor &ColumnDefinitionToleranceSet::passColor()
 {
-    static const QColor color(QStringLiteral("#00914d"));
-    return color;
+    return VerdictColors::passColor();
 }
 
 const QColor &ColumnDefinitionToleranceSet::warningColor()
 {
-    static const QColor color(QStringLiteral("#F2E000"));
-    return color;
+    return VerdictColors::warningColor();
 }
 
 const QColor &ColumnDefinitionToleranceSet::failColor()
 {
-    static const QColor color(QStringLiteral("#FF3D35"));
-    return color;
+    return VerdictColors::failColor();
 }
 
 QVariant ColumnDefinitionToleranceSet::colorOfStatus(int status)
 {
-    switch (status) {
-    case ToleranceJudgement::Pass: return passColor();
-    case ToleranceJudgement::Warning: return warningColor();
-    case ToleranceJudgement::Fail: return failColor();
-    default: return QVariant();
-    }
+    const QColor color = VerdictColors::colorOfStatus(status);
+    return color.isValid() ? QVariant(color) : QVariant();
 }
 
 QString ColumnDefinitionToleranceSet::headerText() const

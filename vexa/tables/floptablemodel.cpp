@@ -2,7 +2,7 @@
 
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/trialselectionmodel.h>
-#include <vexa/tables/columndefinition.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <colorimetry/colorconverter.h>
 #include <colorimetry/colorindicescalculator.h>
@@ -287,7 +287,8 @@ QVariant FlopTableModel::verdictColor(int row) const
         const int status = m_flopTolerance->status(*values, *standardValues, m_condition);
         found = m_verdicts.emplace(values.get(), Verdict{values, status}).first;
     }
-    return ColumnDefinitionToleranceSet::colorOfStatus(found->second.status);
+    const QColor color = VerdictColors::colorOfStatus(found->second.status);
+    return color.isValid() ? QVariant(color) : QVariant();
 }
 
 QVariant FlopTableModel::data(const QModelIndex &index, int role) const

@@ -3,7 +3,7 @@
 #include <vexa/models/trialselectionmodel.h>
 #include <vexa/tables/drawborderdelegate.h>
 #include <vexa/tables/floptablemodel.h>
-#include <vexa/widgets/uihelper.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <domain/trial.h>
 
@@ -41,10 +41,10 @@ protected:
     void initStyleOption(QStyleOptionViewItem *option, const QModelIndex &index) const override
     {
         DrawBorderDelegate::initStyleOption(option, index);
-        const QVariant background = index.data(Qt::BackgroundRole);
-        if (!background.canConvert<QColor>())
+        const QColor background = VerdictColors::colorOfBackground(index.data(Qt::BackgroundRole));
+        if (!background.isValid())
             return;
-        const QColor text = UIHelper::readableTextColor(background.value<QColor>());
+        const QColor text = VerdictColors::readableTextColor(background);
         option->palette.setColor(QPalette::Text, text);
         option->palette.setColor(QPalette::HighlightedText, text);
     }
@@ -82,7 +82,7 @@ FlopTableWidget::FlopTableWidget(std::shared_ptr<GeneralSettings> generalSetting
     header->setSectionResizeMode(FlopTableModel::NameColumn, QHeaderView::Stretch);
     for (int column : {int(FlopTableModel::FlopDifferenceColumn), int(FlopTableModel::FlopColumn)}) {
         const QString text = m_model->headerData(column, Qt::Horizontal).toString();
-        header->resizeSection(column, header->fontMetrics().horizontalAdvance(text) + 24);
+        header->resizeSection(column, header->fontMetrics().horizontalAdvance(text) + 14);
     }
     m_view->horizontalHeader()->setHighlightSections(false);
 

@@ -1,5 +1,7 @@
 #include <vexa/tables/multicolorvaluetablemodel.h>
 
+#include <vexa/widgets/verdictcolors.h>
+
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/colorcomparesettings.h>
 #include <vexa/models/geometryprovider.h>
@@ -406,8 +408,8 @@ QVariant MultiColorValueTableModel::data(const QModelIndex &index, int role) con
         const QVariant background = column->color(*row);
         if (!background.isValid())
             return QVariant();
-        const QColor color = background.value<QColor>();
-        return color == ColumnDefinitionToleranceSet::warningColor() ? QColor(Qt::black) : QColor(Qt::white);
+        // Black or white by the background's luminance: readable (4.5:1 or better) on every verdict colour.
+        return VerdictColors::readableTextColor(VerdictColors::colorOfBackground(background));
     }
     case Qt::TextAlignmentRole:
         return column->alignment();

@@ -3,11 +3,14 @@
 #include <vexa/export/dialogrunner.h>
 #include <vexa/export/jobdetailviewexcelexporter.h>
 #include <vexa/export/tablecsvexporter.h>
+#include <vexa/export/tableprinter.h>
+#include <vexa/export/tableviewexportmodel.h>
 #include <vexa/export/widgetprinter.h>
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/colorcomparesettings.h>
 #include <vexa/models/trialselectionmodel.h>
 #include <vexa/tables/colortableconfiguredialog.h>
+#include <vexa/tables/columndefinition.h>
 #include <vexa/tables/drawborderdelegate.h>
 #include <vexa/tables/multicolorvaluetablemodel.h>
 
@@ -84,6 +87,10 @@ MultiColorValueWidget::MultiColorValueWidget(QWidget *parent)
     connect(m_view->selectionModel(), &QItemSelectionModel::selectionChanged, this,
             &MultiColorValueWidget::onViewSelectionChanged);
     connect(m_proxy, &QAbstractItemModel::modelReset, this, &MultiColorValueWidget::restoreSelection);
+    connect(m_proxy, &QAbstractItemModel::modelReset, this, &MultiColorValueWidget::fitColumns);
+    connect(m_proxy, &QAbstractItemModel::columnsInserted, this, &MultiColorValueWidget::fitColumns);
+    connect(m_proxy, &QAbstractItemModel::columnsRemoved, this, &MultiColorValueWidget::fitColumns);
+    connect(m_proxy, &QAbstractItemModel::headerDataChanged, this, &MultiColorValueWidget::fitColumns);
 
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
@@ -104,6 +111,7 @@ void MultiColorValueWidget::initialize(std::shared_ptr<MultiColorValueTableModel
     m_view->setSelectionBehavior(QAbstractItemView::SelectRows);
     m_view->setItemDelegate(new DrawBorderDelegate(m_view, this));
     m_view->horizontalHeader()->setSectionResizeMode(QHeaderView::Stretch);
+    fitColumns();
     m_view->verticalHeader()->setDefaultSectionSize(25);
     m_view->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
 
@@ -133,14 +141,34 @@ void MultiColorValueWidget::setModels(const std::shared_ptr<AppearanceViewDataMo
     }
 }
 
+std::shared_ptr<TableViewExportModel> MultiColorValueWidget::exportModel() const
+{
+    return std::make_shared<TableViewExportModel>(m_view);
+}
+
 QString MultiColorValueWidget::tableToCSVString() const
 {
-    return TableCSVExporter(m_generalSettings, m_name).exportToString(m_model);
+    if (!m_model)
+        return QString();
+    return TableCSVExporter(m_generalSettings, m_name).exportToString(exportModel().get());
 }
 
 void MultiColorValueWidget::clearSelections()
 {
     m_view->clearSelection();
+}
+
+void MultiColorValueWidget::fitColumns()
+{
+    if (!m_model)
+        return;
+    QHeaderView *header = m_view->horizontalHeader();
+    const int columns = m_proxy->columnCount();
+    for (int c = 0; c < columns; ++c) {
+        const auto column = m_model->columnAt(c);
+        const bool text = column && (column->alignment() & Qt::AlignLeft);
+        header->setSectionResizeMode(c, text ? QHeaderView::ResizeToContents : QHeaderView::Stretch);
+    }
 }
 
 void MultiColorValueWidget::refreshAll()
@@ -263,7 +291,7 @@ void MultiColorValueWidget::onExportToCSV()
     if (!m_model)
         return;
     TableCSVExporter exporter(m_generalSettings, m_name);
-    if (!exporter.exportToFile(m_model, this) && !exporter.errorString().isEmpty())
+    if (!exporter.exportToFile(exporter.exportToString(exportModel().get()), this) && !exporter.errorString().isEmpty())
         showError(tr("Export table to CSV"), exporter.errorString());
 }
 
@@ -275,8 +303,9 @@ void MultiColorValueWidget::onExportToExcel()
     if (!exporter.promptForFilename())
         return;
     exporter.setModels(appearanceViewDataModel(), trialSelectionModel());
-    exporter.setColorDataTableModel(m_model);
-    if (!exporter.exportToFile(selectedSourceIndexes()))
+    const auto shown = exportModel();
+    exporter.setColorDataTableModel(shown);
+    if (!exporter.exportToFile(shown->mapSelection(m_view->selectionModel()->selectedIndexes())))
         showError(tr("Export table to Excel"), exporter.errorString());
 }
 
@@ -305,6 +334,21 @@ void MultiColorValueWidget::onConfigureView()
 void MultiColorValueWidget::print()
 {
     WidgetPrinter::printWidget(this);
+}
+
+bool MultiColorValueWidget::printTable()
+{
+    if (!m_model)
+        return false;
+    const auto shown = exportModel();
+    auto printed = std::make_shared<QSortFilterProxyModel>();
+    printed->setSourceModel(shown.get());
+    TablePrinter printer(printed);
+    const auto dataModel = appearanceViewDataModel();
+    const QString standard = dataModel && dataModel->standard() ? dataModel->standard()->name() : QString();
+    const QString condition = dataModel ? dataModel->colorimetricCondition().toString() : QString();
+    printer.setTitle(m_name.toStdString(), standard.toStdString(), condition.toStdString());
+    return printer.print(this);
 }
 
 void MultiColorValueWidget::onRowClicked(const QModelIndex &index)

@@ -20,6 +20,8 @@ class QTableView;
 
 namespace vexa {
 
+class TableViewExportModel;
+
 class MultiColorValueTableModel;
 
 // Shows a MultiColorValueTableModel in a table view. The row selection follows the
@@ -27,7 +29,8 @@ class MultiColorValueTableModel;
 // geometry, a click on a standard's row selects the standard geometry only, and a trial
 // or geometry selected elsewhere selects its row. A click on a header sorts by that
 // column (the standard's rows stay on top). Ctrl+C copies the selected rows; the context
-// menu exports the table to CSV or Excel and prints a snapshot.
+// menu exports the table to CSV or Excel and prints a snapshot. Exports and the printed
+// table show what the view shows: its rows in their sorted order, without hidden columns.
 class VEXA_EXPORT MultiColorValueWidget : public QWidget, public AppearanceViewBase
 {
     Q_OBJECT
@@ -46,6 +49,8 @@ public:
                    const std::shared_ptr<TrialSelectionModel> &selectionModel, bool showStandard);
 
     std::shared_ptr<MultiColorValueTableModel> tableModel() const { return m_model; }
+    // The table as the view shows it (sorted rows, shown columns), for exports and printing.
+    std::shared_ptr<TableViewExportModel> exportModel() const;
     QString tableToCSVString() const;
     void clearSelections();
     void refreshAll();
@@ -70,6 +75,9 @@ public Q_SLOTS:
     void onExportToExcel();
     void onConfigureView();
     void print();
+    // Prints the whole table (not only what is scrolled into view) as a document, through the
+    // print dialog. False when nothing was printed.
+    bool printTable();
     void onRowClicked(const QModelIndex &index);
     void onHeaderClicked(int section);
     void onContextMenuRequested(const QPoint &pos);
@@ -91,6 +99,9 @@ private:
     void selectStandardRow();
     void selectSourceRow(int sourceRow);
     void restoreSelection();
+    // Text columns (name, geometry, date, instrument) take the width of their contents; the
+    // number columns share the rest.
+    void fitColumns();
     void onViewSelectionChanged();
     void showError(const QString &title, const QString &text);
 

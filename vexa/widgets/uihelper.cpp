@@ -23,7 +23,6 @@
 #include <QVariant>
 
 #include <algorithm>
-#include <cmath>
 
 namespace vexa {
 
@@ -75,29 +74,6 @@ QColor UIHelper::createColorWithChangedSaturation(const QColor &color, double fa
     QColor changed = color;
     changeSaturation(changed, factor);
     return changed;
-}
-
-double UIHelper::relativeLuminance(const QColor &color)
-{
-    const auto linear = [](double channel) {
-        return channel <= 0.04045 ? channel / 12.92 : std::pow((channel + 0.055) / 1.055, 2.4);
-    };
-    const QColor rgb = color.toRgb();
-    return 0.2126 * linear(rgb.redF()) + 0.7152 * linear(rgb.greenF()) + 0.0722 * linear(rgb.blueF());
-}
-
-double UIHelper::contrastRatio(const QColor &first, const QColor &second)
-{
-    const double a = relativeLuminance(first);
-    const double b = relativeLuminance(second);
-    return (std::max(a, b) + 0.05) / (std::min(a, b) + 0.05);
-}
-
-QColor UIHelper::readableTextColor(const QColor &background)
-{
-    const QColor black(Qt::black);
-    const QColor white(Qt::white);
-    return contrastRatio(background, black) >= contrastRatio(background, white) ? black : white;
 }
 
 QIcon UIHelper::createRGBIcon(const RGBValue &rgb, const QSize &size)
@@ -173,14 +149,35 @@ QString UIHelper::trialDisplayString(const NamedObject &object, const QString &f
     if (format.isEmpty())
         return object.name();
     const Timestamp stamp = object.timeStamp();
-    QString text = format;
-    text.replace(QLatin1String("<Name>"), object.name());
-    text.replace(QLatin1String("<Year>"), QString::number(stamp.year()));
-    text.replace(QLatin1String("<Month>"), QString::number(stamp.month()));
-    text.replace(QLatin1String("<Day>"), QString::number(stamp.day()));
-    text.replace(QLatin1String("<Hour>"), QString::number(stamp.hour()));
-    text.replace(QLatin1String("<Minute>"), QString::number(stamp.minute()));
-    text.replace(QLatin1String("<Second>"), QString::number(stamp.second()));
+    // One pass over the format: what a placeholder puts in (a trial named "Batch <Year>") is
+    // never read again as a placeholder.
+    const std::pair<QLatin1String, QString> placeholders[] = {
+        {QLatin1String("<Name>"), object.name()},
+        {QLatin1String("<Year>"), QString::number(stamp.year())},
+        {QLatin1String("<Month>"), QString::number(stamp.month())},
+        {QLatin1String("<Day>"), QString::number(stamp.day())},
+        {QLatin1String("<Hour>"), QString::number(stamp.hour())},
+        {QLatin1String("<Minute>"), QString::number(stamp.minute())},
+        {QLatin1String("<Second>"), QString::number(stamp.second())},
+    };
+    QString text;
+    text.reserve(format.size() + object.name().size());
+    int position = 0;
+    while (position < format.size()) {
+        bool replaced = false;
+        if (format.at(position) == QLatin1Char('<')) {
+            for (const auto &placeholder : placeholders) {
+                if (format.midRef(position, placeholder.first.size()) == placeholder.first) {
+                    text += placeholder.second;
+                    position += placeholder.first.size();
+                    replaced = true;
+                    break;
+                }
+            }
+        }
+        if (!replaced)
+            text += format.at(position++);
+    }
     return text;
 }
 

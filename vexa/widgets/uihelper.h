@@ -42,12 +42,6 @@ public:
     // value are kept, alpha becomes 255.
     static void changeSaturation(QColor &color, double factor);
     static QColor createColorWithChangedSaturation(const QColor &color, double factor);
-    // The relative luminance of an sRGB colour (0 black … 1 white) and the contrast ratio of
-    // two colours (1 … 21), as the accessibility guidelines (WCAG 2) define them.
-    static double relativeLuminance(const QColor &color);
-    static double contrastRatio(const QColor &first, const QColor &second);
-    // Black or white, whichever reads better on the background.
-    static QColor readableTextColor(const QColor &background);
 
     // A rounded colour swatch of the given size; an empty icon for an empty size or a null value.
     static QIcon createRGBIcon(const RGBValue &rgb, const QSize &size);

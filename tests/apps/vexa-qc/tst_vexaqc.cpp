@@ -22,12 +22,18 @@
 #include <domain/formula.h>
 #include <domain/recipetrial.h>
 #include <domain/qcjob.h>
+#include <domain/tolerance.h>
+#include <domain/toleranceset.h>
+#include <domain/tolerancevalue.h>
 #include <domain/trial.h>
 #include <settings/generalsettings.h>
 #include <settings/settingsmanager.h>
 #include <tolerances/tolerancefactory.h>
 
+#include <common/testprerequisites.h>
+
 #include <QComboBox>
+#include <QLabel>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -54,6 +60,7 @@ private Q_SLOTS:
     void flopTableFollowsTheSelection();
     void recipePageShowsTheStoresFormulas();
     void anotherJobReplacesThePage();
+    void toleranceSetThatCannotJudgeSaysWhy();
     void batchJudgeWritesTheWorkbook();
     void batchJudgeRejectsBadRequests_data();
     void batchJudgeRejectsBadRequests();
@@ -211,6 +218,46 @@ void tst_VexaQc::tableAndPlotFollowTheGeometryFilter()
     QCOMPARE(model->rowCount(), 6 * (1 + active));
 }
 
+void tst_VexaQc::toleranceSetThatCannotJudgeSaysWhy()
+{
+    ComparisonPage *page = m_window->page();
+    const auto data = page->dataModel();
+    const auto set = data->currentToleranceSet();
+    QVERIFY(set);
+    QVERIFY(page->toleranceWarning()->isHidden());
+    const auto tolerance = set->tolerances().front();
+    const auto limit = tolerance->toleranceValues().front();
+    const double oldLimit = limit->valueAsDouble();
+    const ColorimetricCondition condition = data->colorimetricCondition();
+    auto refresh = [&] {
+        data->setColorimetricCondition(ColorimetricCondition("A", "10"));
+        data->setColorimetricCondition(condition);
+    };
+    limit->setValue(-1.0);
+    refresh();
+    QVERIFY(page->toleranceWarning()->isVisibleTo(page));
+    QVERIFY2(page->toleranceWarning()->text().contains(tolerance->describe()), qPrintable(page->toleranceWarning()->text()));
+    // The set's column shows no verdict colour at that tolerance's geometry: nothing is judged with it.
+    const auto model = page->tableWidget()->tableModel();
+    int column = -1;
+    for (int c = 0; c < model->columnCount(); ++c) {
+        if (model->headerData(c, Qt::Horizontal).toString() == set->name())
+            column = c;
+    }
+    QVERIFY(column >= 0);
+    int rows = 0;
+    for (int r = 0; r < model->rowCount(); ++r) {
+        if (model->rowAt(r)->geometry() != tolerance->geometryValue() || model->rowAt(r)->isStandard())
+            continue;
+        ++rows;
+        QVERIFY(!model->index(r, column).data(Qt::BackgroundRole).isValid());
+    }
+    QVERIFY(rows > 1);
+    limit->setValue(oldLimit);
+    refresh();
+    QVERIFY(page->toleranceWarning()->isHidden());
+}
+
 void tst_VexaQc::anotherJobReplacesThePage()
 {
     QSignalSpy shown(m_window.get(), &MainWindow::sgJobShown);
@@ -252,8 +299,9 @@ print(json.dumps({"sheets": wb.sheetnames, "title": v["A1"].value, "header": [c.
                   "numberFormat": v["E4"].number_format, "firstValue": v["E4"].value,
                   "summary": summary}))
 )";
+    REQUIRE_PYTHON_MODULES(QStringList{"openpyxl"});
     QProcess python;
-    python.start("/usr/bin/python3", {"-c", script, book});
+    python.start(testprerequisites::python(), {"-c", script, book});
     QVERIFY(python.waitForFinished(60000));
     QVERIFY2(python.exitCode() == 0, python.readAllStandardError().constData());
     const QJsonObject json = QJsonDocument::fromJson(python.readAllStandardOutput()).object();

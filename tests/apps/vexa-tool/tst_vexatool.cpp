@@ -1,7 +1,12 @@
 #include <domain/appearancevalues.h>
 #include <domain/labvalue.h>
 #include <domain/serialization.h>
+#include <domain/tolerance.h>
+#include <domain/toleranceset.h>
+#include <domain/tolerancevalue.h>
 #include <domain/trial.h>
+#include <colorimetry/colordifferenceformulas.h>
+#include <tolerances/tolerancefactory.h>
 
 #include <QCryptographicHash>
 #include <QProcess>
@@ -51,6 +56,9 @@ private Q_SLOTS:
     void checkBrokenFile_data();
     void checkBrokenFile();
     void wrongUsage();
+    void colourDifferenceNamesItsFactors_data();
+    void colourDifferenceNamesItsFactors();
+    void judgeRefusesAToleranceThatCannotJudge();
 
 private:
     QTemporaryDir m_dir;
@@ -154,6 +162,72 @@ void tst_VexaTool::wrongUsage()
     const Result missing = runTool({QStringLiteral("check"), m_dir.filePath(QStringLiteral("missing.json"))});
     QCOMPARE(missing.exitCode, 1);
     QVERIFY(missing.err.contains(QStringLiteral("cannot open")));
+}
+
+void tst_VexaTool::colourDifferenceNamesItsFactors_data()
+{
+    QTest::addColumn<QStringList>("options");
+    QTest::addColumn<int>("exitCode");
+    QTest::addColumn<QString>("expected"); // the start of the line, or of the error
+    const CieLab s{50.0, 20.0, 10.0};
+    const CieLab t{52.0, 21.0, 11.5};
+    const QString cmc21 = QString::number(ColorDifferenceFormulas::cmc(s, t, 2.0, 1.0).dE, 'f', 4);
+    const QString cmc11 = QString::number(ColorDifferenceFormulas::cmc(s, t, 1.0, 1.0).dE, 'f', 4);
+    const QString de00 = QString::number(ColorDifferenceFormulas::ciede2000(s, t, 1.0, 1.0, 1.0).dE, 'f', 10);
+    const QString de00w = QString::number(ColorDifferenceFormulas::ciede2000(s, t, 2.0, 1.0, 1.0).dE, 'f', 4);
+    QTest::newRow("CMC defaults to 2:1") << QStringList{"--formula", "CMC"} << 0 << "CMC l:c=2:1 dE=" + cmc21 + " ";
+    QTest::newRow("CMC 1:1") << QStringList{"--formula", "CMC", "--lc", "1:1"} << 0 << "CMC l:c=1:1 dE=" + cmc11 + " ";
+    QTest::newRow("more digits") << QStringList{"--precision", "10"} << 0 << "CIE2000 kL:kC:kH=1:1:1 dE=" + de00 + " ";
+    QTest::newRow("CIEDE2000 weights") << QStringList{"--weights", "2:1:1"} << 0
+                                       << "CIE2000 kL:kC:kH=2:1:1 dE=" + de00w + " ";
+    QTest::newRow("CIELab has no factors") << QStringList{"--formula", "CIELab", "--precision", "2"} << 0
+                                           << "CIELab dE=" + QString::number(ColorDifferenceFormulas::cie76(s, t).dE, 'f', 2) + " ";
+    QTest::newRow("l:c with one number") << QStringList{"--formula", "CMC", "--lc", "2"} << 2
+                                         << "--lc wants two positive numbers joined by ':' (got \"2\")";
+    QTest::newRow("l:c of zero") << QStringList{"--formula", "CMC", "--lc", "0:1"} << 2 << "--lc wants two";
+    QTest::newRow("l:c for CIEDE2000") << QStringList{"--lc", "2:1"} << 2 << "--lc sets CMC's l:c";
+    QTest::newRow("precision too high") << QStringList{"--precision", "40"} << 2
+                                        << "--precision wants a number of decimals from 0 to 15";
+    QTest::newRow("unknown formula") << QStringList{"--formula", "CIE2001"} << 2 << "Unknown formula \"CIE2001\"";
+}
+
+void tst_VexaTool::colourDifferenceNamesItsFactors()
+{
+    QFETCH(QStringList, options);
+    QFETCH(int, exitCode);
+    QFETCH(QString, expected);
+    const Result r = runTool(QStringList{"de", "50", "20", "10", "52", "21", "11.5"} + options);
+    QCOMPARE(r.exitCode, exitCode);
+    const QString text = exitCode == 0 ? r.out : r.err;
+    QVERIFY2(text.startsWith(expected), qPrintable(text + " does not start with " + expected));
+}
+
+void tst_VexaTool::judgeRefusesAToleranceThatCannotJudge()
+{
+    auto write = [this](const QString &name, const BaseObject &object) {
+        const QString path = m_dir.filePath(name);
+        QFile f(path);
+        f.open(QIODevice::WriteOnly);
+        f.write(object.serialize());
+        return path;
+    };
+    auto standard = std::make_shared<Trial>();
+    standard->setAppearanceValues(std::make_shared<AppearanceValues>());
+    auto lab = std::make_shared<LabValue>(50.0, 20.0, 10.0);
+    lab->setGeometry(Geometry("45as45"));
+    standard->appearanceValues()->addColorValues(lab);
+    auto far = std::make_shared<Trial>();
+    far->setAppearanceValues(std::make_shared<AppearanceValues>());
+    auto farLab = std::make_shared<LabValue>(70.0, 20.0, 10.0);
+    farLab->setGeometry(Geometry("45as45"));
+    far->appearanceValues()->addColorValues(farLab);
+    const auto set = ToleranceFactory::toleranceFactory()->createToleranceSet("CIEDE2000", "Broken", {Geometry("45as45")});
+    set->tolerances().front()->toleranceValue("dE")->setValue(-1.0);
+    const Result r = runTool({"judge", write("standard.json", *standard), write("far.json", *far), write("broken.json", *set)});
+    // A negative limit used to pass a trial 20 ΔE away; now it refuses to judge and says why.
+    QCOMPARE(r.exitCode, 2);
+    QVERIFY2(!r.out.contains("PASS"), qPrintable(r.out));
+    QVERIFY2(r.err.contains("the limit dE is negative (-1)"), qPrintable(r.err));
 }
 
 QTEST_GUILESS_MAIN(tst_VexaTool)

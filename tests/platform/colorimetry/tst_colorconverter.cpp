@@ -33,6 +33,8 @@ private Q_SLOTS:
     void gridsAndStartsAgree();
     void unusableSpectraGiveEmptyValues_data();
     void unusableSpectraGiveEmptyValues();
+    void gridsOutsideTheVisibleGiveNoColour_data();
+    void gridsOutsideTheVisibleGiveNoColour();
     void highlightsAreNotClipped();
     void toLabValuePicksTheGeometry();
     void toLabValueUsesStoredLabOfSameCondition();
@@ -118,6 +120,38 @@ void tst_ColorConverter::unusableSpectraGiveEmptyValues()
     QVERIFY(!ColorConverter::toLab(spectrum, condition).isValid());
     QVERIFY(!ColorConverter::toLCh(spectrum, condition).isValid());
     QVERIFY(!ColorConverter::toXYZ(spectrum, condition).isValid());
+}
+
+void tst_ColorConverter::gridsOutsideTheVisibleGiveNoColour_data()
+{
+    QTest::addColumn<double>("start");
+    QTest::addColumn<double>("interval");
+    QTest::addColumn<int>("count");
+    QTest::addColumn<bool>("coloured");
+    QTest::newRow("near infrared 900-1000") << 900.0 << 10.0 << 11 << false;
+    QTest::newRow("ultraviolet 200-350") << 200.0 << 10.0 << 16 << false;
+    QTest::newRow("one value at 550") << 550.0 << 10.0 << 1 << false;
+    QTest::newRow("450-650") << 450.0 << 10.0 << 21 << false;
+    QTest::newRow("red end 600-830") << 600.0 << 10.0 << 24 << false;
+    QTest::newRow("400-700") << 400.0 << 10.0 << 31 << true;
+    QTest::newRow("420-700") << 420.0 << 10.0 << 29 << true;
+    QTest::newRow("380-780") << 380.0 << 10.0 << 41 << true;
+    QTest::newRow("300-1100 (beyond both ends)") << 300.0 << 10.0 << 81 << true;
+}
+
+void tst_ColorConverter::gridsOutsideTheVisibleGiveNoColour()
+{
+    QFETCH(double, start);
+    QFETCH(double, interval);
+    QFETCH(int, count);
+    QFETCH(bool, coloured);
+    // A grey 50 % reflector: a grid that misses the visible must not read as a plausible grey.
+    const ReflectanceSpectrum spectrum(QVector<double>(count, 0.5), start, interval);
+    for (const char *condition : {"D65/10", "A/2", "F11/10"}) {
+        const ColorimetricCondition c = ColorimetricCondition::fromString(condition);
+        QCOMPARE(ColorConverter::toLab(spectrum, c).isValid(), coloured);
+        QCOMPARE(ColorConverter::toXYZ(spectrum, c).isValid(), coloured);
+    }
 }
 
 void tst_ColorConverter::highlightsAreNotClipped()

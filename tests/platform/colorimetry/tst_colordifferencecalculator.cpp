@@ -2,6 +2,8 @@
 
 #include <domain/labvalue.h>
 
+#include <utilities/logger.h>
+
 #include <QtTest>
 
 #include <cmath>
@@ -19,6 +21,7 @@ private Q_SLOTS:
     void unknownFormulaThrows();
     void invalidValuesGiveNaN();
     void components();
+    void valuesOfDifferentConditionsAreNotCompared();
 };
 
 void tst_ColorDifferenceCalculator::formulasByName_data()
@@ -84,6 +87,33 @@ void tst_ColorDifferenceCalculator::components()
     QVERIFY(std::fabs(ColorDifferenceCalculator::Delta_H(standard, trial) + 2.0000) < 1e-4);
     QVERIFY(std::fabs(ColorDifferenceCalculator::Delta_H(standard, trial, 1, 1, 2) + 1.0000) < 1e-4);
     QVERIFY(std::fabs(ColorDifferenceCalculator::Delta_E(standard, trial) - 3.1819) < 1e-4);
+}
+
+void tst_ColorDifferenceCalculator::valuesOfDifferentConditionsAreNotCompared()
+{
+    struct Sink : LogInterface
+    {
+        void log(LogLevel level, LogCategory, const QString &message) override
+        {
+            if (level == LogLevel::Warning)
+                warnings << message;
+        }
+        QStringList warnings;
+    } sink;
+    Logger::instance().registerLogger(&sink);
+    const LabValue d65(50.0, 10.0, 10.0, ColorimetricCondition("D65", "10"));
+    const LabValue illuminantA(50.5, 10.0, 10.0, ColorimetricCondition("A", "2"));
+    for (const QString &formula : ColorDifferenceCalculator::formulaNames())
+        QVERIFY2(std::isnan(ColorDifferenceCalculator::Default_DE(formula, d65, illuminantA)), qPrintable(formula));
+    QVERIFY(std::isnan(ColorDifferenceCalculator::Delta_L(d65, illuminantA)));
+    QVERIFY(std::isnan(ColorDifferenceCalculator::Delta_E(illuminantA, d65)));
+    Logger::instance().unregisterLogger(&sink);
+    QCOMPARE(sink.warnings.size(), ColorDifferenceCalculator::formulaNames().size() + 2);
+    QVERIFY2(sink.warnings.first().contains("D65/10") && sink.warnings.first().contains("A/2"),
+             qPrintable(sink.warnings.first()));
+    // The same condition compares as before.
+    const LabValue other(50.5, 10.0, 10.0, ColorimetricCondition("D65", "10"));
+    QVERIFY(std::fabs(ColorDifferenceCalculator::Default_DE("CIELab", d65, other) - 0.5) < 1e-12);
 }
 
 QTEST_GUILESS_MAIN(tst_ColorDifferenceCalculator)

@@ -21,7 +21,7 @@ private Q_SLOTS:
     void createdTolerancesCarryTheirLimits_data();
     void createdTolerancesCarryTheirLimits();
     void unknownTypeOrGeometryGivesNull();
-    void cie94ApplicationRewritesWeightsOnce();
+    void cie94ApplicationSetsTheFactors();
     void createToleranceSet();
 };
 
@@ -123,7 +123,7 @@ void tst_ToleranceFactory::unknownTypeOrGeometryGivesNull()
     QVERIFY(ToleranceFactory::toleranceFactory()->supportedGeometries("CIE2001").isEmpty());
 }
 
-void tst_ToleranceFactory::cie94ApplicationRewritesWeightsOnce()
+void tst_ToleranceFactory::cie94ApplicationSetsTheFactors()
 {
     ToleranceFactory *factory = ToleranceFactory::toleranceFactory();
     auto set = factory->createToleranceSet("CIE94", "set", {Geometry("45as45")});
@@ -133,10 +133,11 @@ void tst_ToleranceFactory::cie94ApplicationRewritesWeightsOnce()
     QCOMPARE(tolerance->toleranceParameter("kL")->valueAsDouble(), 2.0);
     QCOMPARE(tolerance->toleranceParameter("K1")->valueAsDouble(), 0.048);
     QCOMPARE(tolerance->toleranceParameter("K2")->valueAsDouble(), 0.014);
-    // kL stays editable: a later recompute without a change of application keeps the user's value.
+    // kL follows the application: shown, not edited, and rewritten by every recompute.
+    QVERIFY(!tolerance->toleranceParameter("kL")->isEditable());
     tolerance->toleranceParameter("kL")->setValue(1.5);
     factory->recomputeToleranceSet(*set);
-    QCOMPARE(tolerance->toleranceParameter("kL")->valueAsDouble(), 1.5);
+    QCOMPARE(tolerance->toleranceParameter("kL")->valueAsDouble(), 2.0);
     tolerance->toleranceParameter("Application")->setValue(QStringLiteral("Graphic arts"));
     factory->recomputeToleranceSet(*set);
     QCOMPARE(tolerance->toleranceParameter("kL")->valueAsDouble(), 1.0);

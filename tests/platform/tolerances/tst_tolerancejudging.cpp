@@ -5,7 +5,12 @@
 #include <domain/appearancevalues.h>
 #include <domain/labvalue.h>
 #include <domain/tolerance.h>
+#include <domain/toleranceparameter.h>
+#include <domain/toleranceset.h>
+#include <domain/tolerancesetparameters.h>
 #include <domain/tolerancevalue.h>
+
+#include <colorimetry/colordifferenceformulas.h>
 
 #include <QtTest>
 
@@ -68,6 +73,12 @@ private Q_SLOTS:
     void effectKernelReferenceValues();
     void effectTypesRejectNonEffectGeometry();
     void flopIndexDifferences();
+    void swappedBoxLimitsJudgeLikeOrderedOnes_data();
+    void swappedBoxLimitsJudgeLikeOrderedOnes();
+    void unusableLimitsGiveNoVerdictAndSayWhy_data();
+    void unusableLimitsGiveNoVerdictAndSayWhy();
+    void cie94FactorsFollowTheApplication_data();
+    void cie94FactorsFollowTheApplication();
     void concurrentJudgingIsDeterministic();
 };
 
@@ -89,7 +100,10 @@ void tst_ToleranceJudging::boxLimit_data()
     QTest::newRow("offset box below") << 0.0 << 1.0 << 2.0 << 3.0;
     QTest::newRow("disabled axis") << 5.0 << 0.0 << 0.0 << 0.0;
     QTest::newRow("zero-width side") << -0.1 << 0.0 << 1.0 << qInf();
-    QTest::newRow("swapped limits") << 0.5 << 1.0 << -1.0 << qInf();
+    // A pair typed the wrong way round is the same box.
+    QTest::newRow("swapped limits inside") << 0.5 << 1.0 << -1.0 << 0.5;
+    QTest::newRow("swapped limits below") << -2.0 << 1.0 << -1.0 << 2.0;
+    QTest::newRow("swapped offset box") << 2.0 << 2.0 << 1.0 << 1.0;
 }
 
 void tst_ToleranceJudging::boxLimit()
@@ -169,9 +183,11 @@ void tst_ToleranceJudging::thresholdsAndLimitsMoveTheBoundary()
     QCOMPARE(wider.status, 1);
     // The main figure is the formula's difference, not the normalised one.
     QCOMPARE(wider.colorDifferences.first(), first.colorDifferences.first());
-    // A broken limit (NaN) fails instead of passing silently.
+    // A broken limit (NaN) judges nothing, and says why.
     tolerance->toleranceValue("dE")->setValue(qQNaN());
-    QCOMPARE(tolerance->status(trial, standard, kCondition), 3);
+    const ToleranceJudgement broken = tolerance->judge(trial, standard, kCondition);
+    QCOMPARE(broken.status, 0);
+    QVERIFY2(broken.error.contains(QStringLiteral("not a number")), qPrintable(broken.error));
 }
 
 void tst_ToleranceJudging::boxWithOffsetLimits()
@@ -268,6 +284,163 @@ void tst_ToleranceJudging::flopIndexDifferences()
     // L*45 = 0: the index is undefined, so no verdict.
     const AppearanceValues black = appearance({{"45as15", 5.0, 0, 0}, {"45as45", 0.0, 0, 0}, {"45as110", 0.0, 0, 0}});
     QCOMPARE(tolerance->status(black, standard, kCondition), 0);
+}
+
+void tst_ToleranceJudging::swappedBoxLimitsJudgeLikeOrderedOnes_data()
+{
+    QTest::addColumn<QString>("type");
+    QTest::addColumn<QString>("axis");
+    QTest::addColumn<double>("shift"); // of the whole sample
+    QTest::addColumn<int>("status");
+    // The metallic sample shifted by s moves L* at 45as45 by s/2 and a* by s/5.
+    QTest::newRow("Lab inside") << "CIELab(+/-)" << "dL" << 0.6 << 1;
+    QTest::newRow("Lab at the reference") << "CIELab(+/-)" << "dL" << 0.0 << 1;
+    QTest::newRow("Lab outside") << "CIELab(+/-)" << "dL" << 3.0 << 3;
+    QTest::newRow("Lab outside below") << "CIELab(+/-)" << "dL" << -3.0 << 3;
+    QTest::newRow("LCh inside") << "CIELCh(+/-)" << "dL" << 0.6 << 1;
+    QTest::newRow("LCh outside") << "CIELCh(+/-)" << "dL" << 3.0 << 3;
+    QTest::newRow("flop inside") << "Flop Index(+/-)" << "dFI" << 0.1 << 1;
+    QTest::newRow("flop outside") << "Flop Index(+/-)" << "dFI" << 8.0 << 3;
+}
+
+void tst_ToleranceJudging::swappedBoxLimitsJudgeLikeOrderedOnes()
+{
+    QFETCH(QString, type);
+    QFETCH(QString, axis);
+    QFETCH(double, shift);
+    QFETCH(int, status);
+    ToleranceFactory *factory = ToleranceFactory::toleranceFactory();
+    const Geometry geometry = factory->supportedGeometries(type).isEmpty() ? Geometry() : Geometry("45as45");
+    const auto ordered = factory->createTolerance(type, geometry);
+    const auto swapped = factory->createTolerance(type, geometry);
+    // As users type them: "dL-" 1, "dL+" -1.
+    swapped->toleranceValue(axis + "-")->setValue(1.0);
+    swapped->toleranceValue(axis + "+")->setValue(-1.0);
+    const AppearanceValues standard = metallic(0.0);
+    const ToleranceJudgement expected = ordered->judge(metallic(shift), standard, kCondition);
+    const ToleranceJudgement actual = swapped->judge(metallic(shift), standard, kCondition);
+    QCOMPARE(expected.status, status);
+    QCOMPARE(actual.status, status);
+    QCOMPARE(actual.normalizedDifference, expected.normalizedDifference);
+    QVERIFY(swapped->validationError().isEmpty());
+
+    // The editor's recompute stores the pair the right way round.
+    auto set = std::make_shared<ToleranceSet>();
+    set->setTolerances({swapped});
+    factory->recomputeToleranceSet(*set);
+    QCOMPARE(swapped->toleranceValue(axis + "-")->valueAsDouble(), -1.0);
+    QCOMPARE(swapped->toleranceValue(axis + "+")->valueAsDouble(), 1.0);
+}
+
+void tst_ToleranceJudging::unusableLimitsGiveNoVerdictAndSayWhy_data()
+{
+    QTest::addColumn<QString>("type");
+    QTest::addColumn<QString>("limit"); // empty: the thresholds are broken instead
+    QTest::addColumn<double>("value");
+    QTest::addColumn<double>("pass");
+    QTest::addColumn<double>("check");
+    QTest::addColumn<QString>("message");
+    for (const char *type : {"CIELab dE*ab", "CIE94", "CMC(l:c)", "CIEDE2000", "DIN99", "DIN99o", "DIN 6175-2", "Audi2000"})
+        QTest::newRow(qPrintable(QStringLiteral("negative dE, %1").arg(type)))
+            << type << "dE" << -1.0 << 1.0 << 0.8 << QStringLiteral("the limit dE is negative (-1)");
+    QTest::newRow("NaN box limit") << "CIELab(+/-)" << "db+" << qQNaN() << 1.0 << 0.8
+                                   << QStringLiteral("the limit db+ is not a number");
+    QTest::newRow("infinite dE") << "CIEDE2000" << "dE" << qInf() << 1.0 << 0.8
+                                 << QStringLiteral("the limit dE is not a number");
+    QTest::newRow("check above pass") << "CIEDE2000" << "" << 0.0 << 1.0 << 1.2
+                                      << QStringLiteral("the check threshold (1.2) is above the pass threshold (1)");
+    QTest::newRow("pass threshold 0") << "CMC(l:c)" << "" << 0.0 << 0.0 << 0.0
+                                      << QStringLiteral("the pass threshold (0) must be a number above 0");
+    QTest::newRow("NaN check threshold") << "CIELCh(+/-)" << "" << 0.0 << 1.0 << qQNaN()
+                                         << QStringLiteral("the check threshold (nan) must be a number of 0 or more");
+}
+
+void tst_ToleranceJudging::unusableLimitsGiveNoVerdictAndSayWhy()
+{
+    QFETCH(QString, type);
+    QFETCH(QString, limit);
+    QFETCH(double, value);
+    QFETCH(double, pass);
+    QFETCH(double, check);
+    QFETCH(QString, message);
+    ToleranceFactory *factory = ToleranceFactory::toleranceFactory();
+    const auto tolerance = factory->createTolerance(type, Geometry("45as45"));
+    QVERIFY(tolerance);
+    if (!limit.isEmpty())
+        tolerance->toleranceValue(limit)->setValue(value);
+    tolerance->setPassThreshold(pass);
+    tolerance->setCheckThreshold(check);
+    const AppearanceValues standard = metallic(0.0);
+    // Far outside any sensible limit and right on the standard: neither may pass.
+    for (double shift : {0.0, 20.0}) {
+        const ToleranceJudgement j = tolerance->judge(metallic(shift), standard, kCondition);
+        QCOMPARE(j.status, 0);
+        QVERIFY2(j.error.contains(message), qPrintable(j.error));
+        QVERIFY2(j.error.contains(QStringLiteral("\"%1\" at 45as45").arg(type)), qPrintable(j.error));
+    }
+    QCOMPARE(tolerance->validationError(), tolerance->judge(standard, standard, kCondition).error);
+    auto set = std::make_shared<ToleranceSet>();
+    set->setName(QStringLiteral("Broken"));
+    set->setTolerances({tolerance});
+    QCOMPARE(factory->validationErrors(*set), QStringList{tolerance->validationError()});
+}
+
+void tst_ToleranceJudging::cie94FactorsFollowTheApplication_data()
+{
+    QTest::addColumn<QString>("path");
+    QTest::addColumn<bool>("setWide"); // the application is a parameter of the set, not of the tolerance
+    for (const char *path : {"as built", "recomputed", "deep copy", "read back", "copied tolerance"}) {
+        QTest::newRow(qPrintable(QStringLiteral("%1, set-wide").arg(path))) << path << true;
+        QTest::newRow(qPrintable(QStringLiteral("%1, own").arg(path))) << path << false;
+    }
+}
+
+void tst_ToleranceJudging::cie94FactorsFollowTheApplication()
+{
+    QFETCH(QString, path);
+    QFETCH(bool, setWide);
+    ToleranceFactory *factory = ToleranceFactory::toleranceFactory();
+    auto set = factory->createToleranceSet("CIE94", "Textile", {Geometry("45as45")});
+    if (setWide) {
+        // The tolerance's own "Application" still says "Graphic arts": the set's rules.
+        auto application = std::make_shared<ToleranceParameter>(
+            QStringLiteral("Application"), QStringLiteral("Application"), ToleranceParameter::ParameterType::Choice,
+            QStringLiteral("Textiles"));
+        set->toleranceSetParameters()->setToleranceParameters({application});
+    } else {
+        set->tolerances().front()->toleranceParameter("Application")->setValue(QStringLiteral("Textiles"));
+    }
+    if (path == "recomputed") {
+        factory->recomputeToleranceSet(*set);
+    } else if (path == "deep copy") {
+        set = std::dynamic_pointer_cast<ToleranceSet>(set->deepCopy());
+    } else if (path == "read back") {
+        auto read = std::make_shared<ToleranceSet>();
+        QString error;
+        QVERIFY2(read->deserialize(set->serialize(), &error), qPrintable(error));
+        set = read;
+    }
+    std::shared_ptr<Tolerance> tolerance = set->tolerances().front();
+    if (path == "copied tolerance") {
+        // A tolerance copied out of its set keeps the parameters it was judged with.
+        tolerance = std::dynamic_pointer_cast<Tolerance>(tolerance->deepCopy());
+    }
+    QVERIFY(tolerance);
+
+    const CieLab s{50.0, 20.0, 10.0};
+    const CieLab t{52.0, 21.0, 11.5};
+    const AppearanceValues standard = appearance({{"45as45", s.L, s.a, s.b}});
+    const AppearanceValues trial = appearance({{"45as45", t.L, t.a, t.b}});
+    const double textiles = ColorDifferenceFormulas::cie94(s, t, 2.0, 1.0, 1.0, 0.048, 0.014).dE;
+    const double graphicArts = ColorDifferenceFormulas::cie94(s, t, 1.0, 1.0, 1.0, 0.045, 0.015).dE;
+    QVERIFY(std::fabs(textiles - graphicArts) > 0.1);
+    const ToleranceJudgement j = tolerance->judge(trial, standard, kCondition);
+    QVERIFY2(std::fabs(j.colorDifferences.first() - textiles) < 1e-12,
+             qPrintable(QStringLiteral("dE94 %1, textiles %2, graphic arts %3")
+                            .arg(j.colorDifferences.first()).arg(textiles).arg(graphicArts)));
+    // A stale kL typed into the tolerance does not change the verdict either.
+    tolerance->toleranceParameter("kL")->setValue(1.0);
+    QCOMPARE(tolerance->judge(trial, standard, kCondition).colorDifferences.first(), j.colorDifferences.first());
 }
 
 void tst_ToleranceJudging::concurrentJudgingIsDeterministic()

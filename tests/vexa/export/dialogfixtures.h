@@ -5,10 +5,14 @@
 
 #include <vexa/export/dialogrunner.h>
 
+#include <common/testprerequisites.h>
+
 #include <QDialog>
 #include <QFileDialog>
 #include <QJsonDocument>
 #include <QJsonObject>
+#include <QPrintDialog>
+#include <QPrinter>
 #include <QProcess>
 #include <QStringList>
 
@@ -54,17 +58,39 @@ struct RunDialogs
     RunDialogs &operator=(const RunDialogs &) = delete;
 };
 
-// Debian's Python with python3-openpyxl (not whichever python3 comes first on PATH).
+// Runs print dialogs by printing into a PDF file and records what the dialog showed; any
+// other dialog is cancelled. `before` runs first, when the dialog is shown.
+struct PrintToPdf
+{
+    explicit PrintToPdf(QString file, std::function<void(QDialog &)> before = nullptr)
+    {
+        vexa::DialogRunner::setFunction([file, before, this](QDialog &dialog) {
+            ++shown;
+            title = dialog.windowTitle();
+            parent = dialog.parentWidget();
+            if (before)
+                before(dialog);
+            auto *printDialog = qobject_cast<QPrintDialog *>(&dialog);
+            if (!printDialog)
+                return int(QDialog::Rejected);
+            printDialog->printer()->setOutputFormat(QPrinter::PdfFormat);
+            printDialog->printer()->setOutputFileName(file);
+            return int(QDialog::Accepted);
+        });
+    }
+    ~PrintToPdf() { vexa::DialogRunner::setFunction(nullptr); }
+    PrintToPdf(const PrintToPdf &) = delete;
+    PrintToPdf &operator=(const PrintToPdf &) = delete;
+
+    int shown = 0;
+    QString title;
+    QWidget *parent = nullptr;
+};
+
+// Debian's Python with python3-openpyxl and python3-pil (openpyxl reads images through Pillow).
 inline QString workbookReaderPython()
 {
-    return QStringLiteral("/usr/bin/python3");
-}
-
-inline bool workbookReaderAvailable()
-{
-    QProcess probe;
-    probe.start(workbookReaderPython(), {QStringLiteral("-c"), QStringLiteral("import openpyxl")});
-    return probe.waitForFinished(30000) && probe.exitStatus() == QProcess::NormalExit && probe.exitCode() == 0;
+    return testprerequisites::python();
 }
 
 // The workbook as openpyxl reads it (see read_xlsx.py); an empty object when it cannot be read,

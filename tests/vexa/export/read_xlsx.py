@@ -8,7 +8,14 @@ import datetime
 import json
 import sys
 
-import openpyxl
+try:
+    import openpyxl
+    import PIL  # openpyxl reads a sheet's images only through Pillow
+except ImportError as error:
+    package = {"openpyxl": "python3-openpyxl", "PIL": "python3-pil"}.get(error.name, "python3-" + str(error.name))
+    sys.stderr.write("read_xlsx.py: the Python module %s is missing: install the Debian package %s "
+                     "(scripts/setup.sh does)\n" % (error.name, package))
+    sys.exit(2)
 
 
 def main(path):

@@ -11,6 +11,10 @@
 #include <settings/generalsettings.h>
 
 #include <QBrush>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QLocale>
+#include <QProcess>
 #include <QFileDialog>
 #include <QSettings>
 #include <QTemporaryDir>
@@ -71,7 +75,11 @@ private Q_SLOTS:
         QCoreApplication::setApplicationName("tst_tablecsvexporter");
         QSettings::setDefaultFormat(QSettings::IniFormat);
         QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, m_settingsDir.path());
+        // Numbers and delimiters as in the C locale unless a test says otherwise.
+        QLocale::setDefault(QLocale::c());
     }
+
+    void cleanup() { QLocale::setDefault(QLocale::c()); }
 
     void shouldWriteTheTableExactly_data()
     {
@@ -156,7 +164,7 @@ private Q_SLOTS:
             if (QDir(desktops.value(0)).exists())
                 QCOMPARE(chooser.shownFolder, QDir(desktops.first()).absolutePath());
         }
-        QCOMPARE(readAll(file), QByteArray("L*;a*;\n1.00;2.00 PASS;\n"));
+        QCOMPARE(readAll(file), QByteArray("\xef\xbb\xbfL*;a*;\n1.00;2.00 PASS;\n"));
         QCOMPARE(QSettings().value("UI/Colour/CSVExportPath").toString(), QDir(dir.path()).absolutePath());
 
         // The next prompt opens in the remembered folder.
@@ -202,7 +210,8 @@ private Q_SLOTS:
         const QString path = dir.filePath("utf8.csv");
         TableCSVExporter exporter(std::make_shared<GeneralSettings>(), "Utf8");
         QVERIFY(exporter.writeToFile(QString::fromUtf8("h°;ΔE*ab;\n"), path));
-        QCOMPARE(readAll(path), QByteArray("h\xc2\xb0;\xce\x94" "E*ab;\n"));
+        // UTF-8 with a byte order mark: spreadsheets on Windows read accents right only with it.
+        QCOMPARE(readAll(path), QByteArray("\xef\xbb\xbf" "h\xc2\xb0;\xce\x94" "E*ab;\n"));
     }
 
     void shouldNameTheVerdicts_data()
@@ -212,7 +221,11 @@ private Q_SLOTS:
         QTest::newRow("pass") << QVariant(QColor("#00914d")) << "PASS";
         QTest::newRow("warning") << QVariant(QColor("#F2E000")) << "WARNING";
         QTest::newRow("fail text") << QVariant(QString("#ff3d35")) << "FAIL";
-        QTest::newRow("upper-case text is no verdict") << QVariant(QString("#FF3D35")) << "";
+        QTest::newRow("upper-case text") << QVariant(QString("#FF3D35")) << "FAIL";
+        QTest::newRow("warning text, mixed case") << QVariant(QString(" #f2E000")) << "WARNING";
+        QTest::newRow("brush") << QVariant(QBrush(QColor("#00914D"))) << "PASS";
+        QTest::newRow("empty brush") << QVariant(QBrush()) << "";
+        QTest::newRow("translucent verdict colour") << QVariant(QColor(0xff, 0x3d, 0x35, 128)) << "FAIL";
         QTest::newRow("other colour") << QVariant(QColor(Qt::red)) << "";
         QTest::newRow("none") << QVariant() << "";
         QTest::newRow("invalid colour") << QVariant(QColor()) << "";
@@ -223,6 +236,65 @@ private Q_SLOTS:
         QFETCH(QVariant, background);
         QFETCH(QString, verdict);
         QCOMPARE(TableCSVExporter::verdictOfBackground(background), verdict);
+    }
+
+    void delimiterThatIsTheDecimalSeparatorGivesWay_data()
+    {
+        QTest::addColumn<QString>("locale");
+        QTest::addColumn<QString>("delimiter");
+        QTest::addColumn<QString>("written");
+        QTest::newRow("German, comma") << "de_DE" << "," << ";";
+        QTest::newRow("German, semicolon") << "de_DE" << ";" << ";";
+        QTest::newRow("English, comma") << "en_US" << "," << ",";
+        QTest::newRow("French, comma") << "fr_FR" << "," << ";";
+    }
+
+    void delimiterThatIsTheDecimalSeparatorGivesWay()
+    {
+        QFETCH(QString, locale);
+        QFETCH(QString, delimiter);
+        QFETCH(QString, written);
+        QLocale::setDefault(QLocale(locale));
+        auto settings = std::make_shared<GeneralSettings>();
+        QVERIFY(settings->setExportDelimiter(delimiter));
+        TableCSVExporter exporter(settings, "Locale");
+        QCOMPARE(exporter.exportDelimiter(), delimiter);
+        QCOMPARE(exporter.effectiveDelimiter(), written);
+        const QString number = QLocale().toString(1.23, 'f', 2);
+        QCOMPARE(exporter.exportToString(tableOf({"dE"}, {{number}})), QStringLiteral("dE%1\n%2%1\n").arg(written, number));
+    }
+
+    // An independent reader: Python's csv module reads the file as a German spreadsheet user's
+    // file, names with accents and decimal commas intact.
+    void germanFileReadsBackInPython()
+    {
+        QLocale::setDefault(QLocale(QLocale::German, QLocale::Germany));
+        auto settings = std::make_shared<GeneralSettings>();
+        QVERIFY(settings->setExportDelimiter(","));
+        TableCSVExporter exporter(settings, "German");
+        const QString name = QString::fromUtf8("Bl\xc3\xa4ulich Gr\xc3\xbcn \xc3\xa9t\xc3\xa9");
+        const auto model = tableOf({"Name", "L*", "dE"},
+                                   {{name, QLocale().toString(52.25, 'f', 2), QLocale().toString(1.5, 'f', 2) + "@#FF3D35"}});
+        QTemporaryDir dir;
+        const QString path = dir.filePath("german.csv");
+        QVERIFY(exporter.writeToFile(exporter.exportToString(model), path));
+        QVERIFY(readAll(path).startsWith("\xef\xbb\xbf"));
+
+        REQUIRE_PYTHON_MODULES(QStringList{"csv"});
+        const char *script = R"(
+import csv, json, sys
+with open(sys.argv[1], newline="", encoding="utf-8-sig") as f:
+    print(json.dumps(list(csv.reader(f, delimiter=";")), ensure_ascii=False))
+)";
+        QProcess python;
+        python.start(testprerequisites::python(), {"-c", script, path});
+        QVERIFY(python.waitForFinished(30000));
+        QVERIFY2(python.exitCode() == 0, python.readAllStandardError().constData());
+        const QJsonArray rows = QJsonDocument::fromJson(python.readAllStandardOutput()).array();
+        QCOMPARE(rows.size(), 2);
+        // Every line ends with the delimiter: one empty field after the last.
+        QCOMPARE(rows.at(0).toArray().toVariantList(), (QVariantList{"Name", "L*", "dE", ""}));
+        QCOMPARE(rows.at(1).toArray().toVariantList(), (QVariantList{name, "52,25", "1,50 FAIL", ""}));
     }
 };
 

@@ -90,8 +90,7 @@ private Q_SLOTS:
         QCoreApplication::setApplicationName("tst_tableexcelexporter");
         QSettings::setDefaultFormat(QSettings::IniFormat);
         QSettings::setPath(QSettings::IniFormat, QSettings::UserScope, m_settingsDir.path());
-        if (!workbookReaderAvailable())
-            QSKIP("/usr/bin/python3 with openpyxl (Debian's python3-openpyxl) is needed to read the workbooks back");
+        REQUIRE_PYTHON_MODULES(testprerequisites::workbookReaderModules());
     }
 
     void shouldWriteValuesFormatsAndVerdictFills()

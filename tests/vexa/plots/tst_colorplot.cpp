@@ -2,7 +2,9 @@
 // the worker thread, settings, selection, zoom and printing.
 
 #include "plotfixtures.h"
+#include "export/dialogfixtures.h"
 
+#include <vexa/export/widgetprinter.h>
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/trialselectionmodel.h>
 #include <vexa/plots/absolutecolorplotab.h>
@@ -24,6 +26,7 @@
 #include <QGraphicsScene>
 #include <QMenu>
 #include <QPointer>
+#include <QPrintDialog>
 #include <QPrinter>
 #include <QScrollBar>
 #include <QSignalSpy>
@@ -133,8 +136,12 @@ private Q_SLOTS:
     void wheelZoomHasLowerBound_data();
     void wheelZoomHasLowerBound();
     void dragPansTheView();
+    void panningWorksAtTheInitialZoom();
     void directionMarkersSitOnTheEdges();
-    void snapshotPrintingUsesTheInjectedPrinter();
+    void directionMarkersLeaveTheTickLabelsFree_data();
+    void directionMarkersLeaveTheTickLabelsFree();
+    void standardLabelLeavesTheMarkersFree();
+    void snapshotPrintsThroughTheDialogRunner();
     void printImageWritesPdf();
 };
 
@@ -694,6 +701,19 @@ void tst_ColorPlot::wheelZoomHasLowerBound()
     QCOMPARE(view->zoom(), 2.0);
 }
 
+namespace {
+
+// A middle-button drag on the view's viewport from `from` by `by` pixels.
+void dragWithMiddleButton(ZoomGraphicsView *view, const QPoint &from, const QPoint &by)
+{
+    QTest::mousePress(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from);
+    QMouseEvent move(QEvent::MouseMove, QPointF(from + by), Qt::NoButton, Qt::MiddleButton, Qt::NoModifier);
+    QApplication::sendEvent(view->viewport(), &move);
+    QTest::mouseRelease(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from + by);
+}
+
+} // namespace
+
 void tst_ColorPlot::dragPansTheView()
 {
     Page page = makePage();
@@ -705,16 +725,117 @@ void tst_ColorPlot::dragPansTheView()
     QVERIFY(view->setZoom(4.0));
     const QPoint start = view->viewport()->rect().center();
     const QPointF before = view->mapToScene(start);
-    const QPoint from = start + QPoint(0, 60);
-    QTest::mousePress(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from);
-    QMouseEvent move(QEvent::MouseMove, QPointF(from + QPoint(-30, -20)), Qt::NoButton, Qt::MiddleButton, Qt::NoModifier);
-    QApplication::sendEvent(view->viewport(), &move);
-    QTest::mouseRelease(view->viewport(), Qt::MiddleButton, Qt::NoModifier, from + QPoint(-30, -20));
+    dragWithMiddleButton(view, start + QPoint(0, 60), QPoint(-30, -20));
     const QPointF after = view->mapToScene(start);
     // The content moved with the cursor: the view now looks 30 px right and 20 px down of before.
     const double scale = view->transform().m11();
     QVERIFY2(std::abs((after.x() - before.x()) * scale - 30) <= 1.5, qPrintable(QString::number((after.x() - before.x()) * scale)));
     QVERIFY(std::abs((after.y() - before.y()) * scale - 20) <= 1.5);
+}
+
+void tst_ColorPlot::panningWorksAtTheInitialZoom()
+{
+    Page page = makePage();
+    auto plot = makePlot<AbsoluteColorPlotAB>();
+    plot->setModels(page.data, page.selection);
+    plot->show();
+    QVERIFY(QTest::qWaitForWindowExposed(plot.get()));
+    ZoomGraphicsView *view = plot->view();
+    QCOMPARE(view->zoom(), 1.0);
+    const QPointF fitCentre = view->fitRect().center();
+    auto drag = [view](const QPoint &by) { dragWithMiddleButton(view, view->viewport()->rect().center(), by); };
+    const QPoint middle = view->viewport()->rect().center();
+    const QPointF before = view->mapToScene(middle);
+    drag(QPoint(-40, 25));
+    const double scale = view->transform().m11();
+    const QPointF after = view->mapToScene(middle);
+    QVERIFY2(std::abs((after.x() - before.x()) * scale - 40) <= 1.5, qPrintable(QString::number((after.x() - before.x()) * scale)));
+    QVERIFY(std::abs((after.y() - before.y()) * view->transform().m22() + 25) <= 1.5);
+
+    // Zoomed out a little and back: still free to move, and back to the middle by dragging back.
+    QVERIFY(view->zoomBy(0.98, QPointF(middle)));
+    QVERIFY(view->zoomBy(1.0 / 0.98, QPointF(middle)));
+    QVERIFY(std::abs(view->zoom() - 1.0) < 1e-9);
+    drag(QPoint(40, -25));
+    const QPointF centred = view->centre();
+    QVERIFY2(std::abs(centred.x() - fitCentre.x()) * scale <= 2.0 && std::abs(centred.y() - fitCentre.y()) * scale <= 2.0,
+             qPrintable(QStringLiteral("%1,%2 vs %3,%4").arg(centred.x()).arg(centred.y()).arg(fitCentre.x()).arg(fitCentre.y())));
+    // The view cannot be dragged off into nothing: the centre stays within the pan area.
+    for (int i = 0; i < 20; ++i)
+        drag(QPoint(200, 0));
+    QVERIFY(view->panArea().contains(view->centre()));
+    view->resetZoom();
+    QVERIFY(std::abs(view->centre().x() - fitCentre.x()) * scale <= 1.5);
+    QVERIFY(std::abs(view->mapToScene(view->freeArea().center().toPoint()).x() - fitCentre.x()) * scale <= 1.5);
+}
+
+void tst_ColorPlot::directionMarkersLeaveTheTickLabelsFree_data()
+{
+    QTest::addColumn<QSize>("size");
+    QTest::newRow("500x420") << QSize(500, 420);
+    QTest::newRow("700x450") << QSize(700, 450);
+    QTest::newRow("square 400") << QSize(400, 400);
+    QTest::newRow("tall 380x600") << QSize(380, 600);
+    QTest::newRow("wide 1000x380") << QSize(1000, 380);
+}
+
+void tst_ColorPlot::directionMarkersLeaveTheTickLabelsFree()
+{
+    QFETCH(QSize, size);
+    Page page = makePage();
+    auto plot = makePlot<AbsoluteColorPlotAB>();
+    plot->resize(size);
+    plot->setModels(page.data, page.selection);
+    plot->show();
+    QVERIFY(QTest::qWaitForWindowExposed(plot.get()));
+    auto *view = qobject_cast<LabColorPlotGraphicsView *>(plot->view());
+    QVERIFY(view);
+    QVERIFY(!plot->tickLabels().isEmpty());
+    for (const QRectF &bar : view->directionMarkerRects()) {
+        const QRectF barPixels = view->mapFromScene(bar).boundingRect();
+        for (const TextItem *label : plot->tickLabels()) {
+            // The labels keep their pixel size: their rectangle is in viewport pixels around their anchor.
+            const QRectF labelPixels = label->boundingRect().translated(view->mapFromScene(label->pos()));
+            QVERIFY2(!barPixels.intersects(labelPixels),
+                     qPrintable(QStringLiteral("bar %1,%2 %3x%4 covers the label \"%5\"")
+                                    .arg(barPixels.x()).arg(barPixels.y()).arg(barPixels.width())
+                                    .arg(barPixels.height()).arg(label->text())));
+        }
+    }
+}
+
+void tst_ColorPlot::standardLabelLeavesTheMarkersFree()
+{
+    Page page = makePage();
+    auto plot = makePlot<AbsoluteColorPlotAB>();
+    plot->setModels(page.data, page.selection);
+    plot->show();
+    QVERIFY(QTest::qWaitForWindowExposed(plot.get()));
+    TextItem *label = plot->standardLabel();
+    QVERIFY(label && label->isVisible());
+    QCOMPARE(label->acceptedMouseButtons(), Qt::NoButton); // clicks reach the markers under it
+    QVERIFY(label->background().color().alpha() < 255);    // and a marker under it still shows
+    QVERIFY(label->zValue() > 2);
+    ZoomGraphicsView *view = plot->view();
+    // Crowd the side where the label goes first (up and to the right of the standard) with markers.
+    const QPointF anchor = view->mapFromScene(label->pos());
+    const QRectF upRight(anchor + QPointF(8, -22), QSizeF(40, 14));
+    // The other trials go far from the standard, to the frame's corner.
+    for (TrialGraphicsItem *item : plot->trialItems())
+        item->setPos(plot->frameItem()->rect().topLeft() + QPointF(1, 1));
+    int crowded = 0;
+    for (TrialGraphicsItem *item : plot->trialItems()) {
+        if (crowded == 6)
+            break;
+        const QPointF target = upRight.topLeft() + QPointF(6.0 * crowded, 7.0 * (crowded % 2));
+        item->setPos(view->mapToScene(target.toPoint()));
+        ++crowded;
+    }
+    QCOMPARE(crowded, 6);
+    view->setZoom(1.2); // any change of the view places the label again
+    const QRectF labelRect = label->boundingRect().translated(view->mapFromScene(label->pos()));
+    for (TrialGraphicsItem *item : plot->trialItems())
+        QVERIFY2(!labelRect.contains(view->mapFromScene(item->pos())), qPrintable(item->trial()->name()));
 }
 
 void tst_ColorPlot::directionMarkersSitOnTheEdges()
@@ -739,37 +860,36 @@ void tst_ColorPlot::directionMarkersSitOnTheEdges()
     QVERIFY(std::abs(bars[2].center().x() - visible.center().x()) < 1e-9);
 }
 
-void tst_ColorPlot::snapshotPrintingUsesTheInjectedPrinter()
+void tst_ColorPlot::snapshotPrintsThroughTheDialogRunner()
 {
     Page page = makePage();
     page.selection->setSelectedTrial(page.sample.trials[1]);
-    ColorPlotWidget widget;
+    QWidget host;
+    auto *widget = new ColorPlotWidget(&host);
     auto *ab = new AbsoluteColorPlotAB;
     ab->initialize(nullptr);
     auto *l = new AbsoluteColorPlotL;
     l->initialize(nullptr);
-    widget.initialize(ab, l);
-    widget.setModels(page.data, page.selection);
-    widget.resize(700, 450);
-    QCOMPARE(ab->parentWidget(), &widget);
-    QCOMPARE(widget.printSnapshotAction()->text(), QStringLiteral("Print Snapshot"));
-    QVERIFY(widget.contextMenu()->actions().contains(widget.printSnapshotAction()));
+    widget->initialize(ab, l);
+    widget->setModels(page.data, page.selection);
+    widget->resize(700, 450);
+    QCOMPARE(ab->parentWidget(), widget);
+    QCOMPARE(widget->printSnapshotAction()->text(), QStringLiteral("Print Snapshot"));
+    QVERIFY(widget->contextMenu()->actions().contains(widget->printSnapshotAction()));
     QCOMPARE(l->view()->horizontalScrollBarPolicy(), Qt::ScrollBarAlwaysOff);
 
-    int printed = 0;
+    // The snapshot goes through the same seam as every printed widget: no dialog opens.
+    QTemporaryDir dir;
+    const QString pdf = dir.filePath(QStringLiteral("snapshot.pdf"));
     bool decorationsRestored = false;
-    QSize size;
-    widget.setSnapshotPrinter([&](const QImage &image, QWidget *parent) {
-        ++printed;
-        size = image.size();
-        QCOMPARE(parent, &widget);
-        decorationsRestored = !ab->isPreparedForPrinting();
-    });
+    PrintToPdf print(pdf, [&](QDialog &) { decorationsRestored = !ab->isPreparedForPrinting(); });
     // The context menu's action prints.
-    widget.printSnapshotAction()->trigger();
-    QCOMPARE(printed, 1);
-    QCOMPARE(size, widget.size());
-    QVERIFY(decorationsRestored); // the snapshot is taken before the printer is asked
+    widget->printSnapshotAction()->trigger();
+    QCOMPARE(print.shown, 1);
+    QCOMPARE(print.title, QStringLiteral("Print Visual"));
+    QCOMPARE(print.parent, &host);
+    QVERIFY(decorationsRestored); // the snapshot is taken before the dialog is asked
+    QVERIFY(QFileInfo(pdf).size() > 500);
 
     ab->prepareForPrinting();
     QVERIFY(ab->scene()->selectedItems().isEmpty());
@@ -778,8 +898,8 @@ void tst_ColorPlot::snapshotPrintingUsesTheInjectedPrinter()
 
     // A context-menu request on a plot opens the menu (without blocking).
     Q_EMIT ab->customContextMenuRequested(QPoint(10, 10));
-    QTRY_VERIFY(widget.contextMenu()->isVisible());
-    widget.contextMenu()->hide();
+    QTRY_VERIFY(widget->contextMenu()->isVisible());
+    widget->contextMenu()->hide();
 }
 
 void tst_ColorPlot::printImageWritesPdf()
@@ -792,9 +912,11 @@ void tst_ColorPlot::printImageWritesPdf()
     printer.setOutputFileName(file);
     QImage image(300, 200, QImage::Format_RGB32);
     image.fill(Qt::darkCyan);
-    QVERIFY(ColorPlotWidget::printImage(image, printer));
+    QVERIFY(WidgetPrinter::render(image, printer));
     QVERIFY(QFileInfo(file).size() > 500);
-    QVERIFY(!ColorPlotWidget::printImage(QImage(), printer));
+    QVERIFY(!WidgetPrinter::render(QImage(), printer));
+    RunDialogs cancel([](QDialog &) { return int(QDialog::Rejected); });
+    QVERIFY(!WidgetPrinter::printImage(image, nullptr));
 }
 
 QTEST_MAIN(tst_ColorPlot)

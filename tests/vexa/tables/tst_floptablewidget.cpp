@@ -10,7 +10,7 @@
 #include <vexa/tables/columndefinition.h>
 #include <vexa/tables/floptablemodel.h>
 #include <vexa/tables/floptablewidget.h>
-#include <vexa/widgets/uihelper.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <settings/generalsettings.h>
 #include <tolerances/tolerancefactory.h>
@@ -89,40 +89,6 @@ private Q_SLOTS:
         QCOMPARE(delegate->displayText(QStringLiteral("T1"), QLocale::c()), QStringLiteral("T1"));
     }
 
-    // Black or white, whichever reads better: at least 4.5:1 on every verdict colour.
-    void shouldWriteReadableTextOnTheVerdictColours_data()
-    {
-        QTest::addColumn<QColor>("background");
-        QTest::addColumn<QColor>("expected");
-        QTest::newRow("pass") << ColumnDefinitionToleranceSet::passColor() << QColor(Qt::black);
-        QTest::newRow("warning") << ColumnDefinitionToleranceSet::warningColor() << QColor(Qt::black);
-        QTest::newRow("fail") << ColumnDefinitionToleranceSet::failColor() << QColor(Qt::black);
-        QTest::newRow("dark blue") << QColor("#1f3f8f") << QColor(Qt::white);
-        QTest::newRow("white") << QColor(Qt::white) << QColor(Qt::black);
-        QTest::newRow("black") << QColor(Qt::black) << QColor(Qt::white);
-    }
-
-    void shouldWriteReadableTextOnTheVerdictColours()
-    {
-        QFETCH(QColor, background);
-        QFETCH(QColor, expected);
-        const QColor text = UIHelper::readableTextColor(background);
-        QCOMPARE(text, expected);
-        if (background != QColor("#1f3f8f"))
-            QVERIFY2(UIHelper::contrastRatio(text, background) >= 4.5,
-                     qPrintable(QString::number(UIHelper::contrastRatio(text, background))));
-    }
-
-    void shouldComputeLuminanceAndContrast()
-    {
-        QCOMPARE(UIHelper::relativeLuminance(Qt::white), 1.0);
-        QCOMPARE(UIHelper::relativeLuminance(Qt::black), 0.0);
-        QCOMPARE(UIHelper::contrastRatio(Qt::white, Qt::black), 21.0);
-        QCOMPARE(UIHelper::contrastRatio(Qt::black, Qt::white), 21.0);
-        // sRGB 128 grey: 0.2158605.
-        QVERIFY(std::fabs(UIHelper::relativeLuminance(QColor(128, 128, 128)) - 0.2158605) < 1e-6);
-    }
-
     void shouldPaintTheSilverMetallic()
     {
         samplestore::SampleStore store;
@@ -156,6 +122,28 @@ private Q_SLOTS:
         for (int y = column.top(); y <= column.bottom(); y += 3)
             colours.insert(image.pixel(offset.x() + column.left() + 4, offset.y() + y) & 0xffffff);
         QVERIFY(colours.contains(QColor("#00914d").rgb() & 0xffffff));
+
+        // The numbers on the verdict colours are written in black (readable on all three),
+        // the others in the view's text colour.
+        int verdictCells = 0;
+        for (int r = 1; r < view->model()->rowCount(); ++r) {
+            const QModelIndex index = view->model()->index(r, 1);
+            const QColor background = VerdictColors::colorOfBackground(index.data(Qt::BackgroundRole));
+            if (!background.isValid() || r == 4) // row 4 is selected: framed
+                continue;
+            ++verdictCells;
+            const QRect cell = view->visualRect(index).adjusted(3, 3, -3, -3).translated(offset);
+            int dark = 0, light = 0;
+            for (int y = cell.top(); y <= cell.bottom(); ++y) {
+                for (int x = cell.left(); x <= cell.right(); ++x) {
+                    const double luminance = VerdictColors::relativeLuminance(image.pixelColor(x, y));
+                    dark += luminance < 0.05 ? 1 : 0;
+                    light += luminance > 0.8 ? 1 : 0;
+                }
+            }
+            QVERIFY2(dark > 10 && light == 0, qPrintable(QStringLiteral("row %1: %2 dark, %3 light").arg(r).arg(dark).arg(light)));
+        }
+        QVERIFY(verdictCells >= 10);
         const QString target = qEnvironmentVariable("VEXA_SCREENSHOT_DIR");
         if (!target.isEmpty())
             QVERIFY(image.save(QDir(target).filePath("flop-table.png")));

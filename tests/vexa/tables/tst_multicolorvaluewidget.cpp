@@ -10,6 +10,9 @@
 #include <vexa/tables/drawborderdelegate.h>
 #include <vexa/tables/multicolorvaluetablemodel.h>
 #include <vexa/tables/multicolorvaluewidget.h>
+#include <vexa/export/tablecsvexporter.h>
+#include <vexa/export/tableviewexportmodel.h>
+#include <vexa/widgets/verdictcolors.h>
 
 #include <domain/trial.h>
 
@@ -21,6 +24,7 @@
 #include <QMenu>
 #include <QMessageBox>
 #include <QPrintDialog>
+#include <QPrinter>
 #include <QSettings>
 #include <QSignalSpy>
 #include <QSortFilterProxyModel>
@@ -98,7 +102,11 @@ private Q_SLOTS:
         Fixture f;
         QCOMPARE(f.view()->selectionBehavior(), QAbstractItemView::SelectRows);
         QVERIFY(qobject_cast<DrawBorderDelegate *>(f.view()->itemDelegate()));
-        QCOMPARE(f.view()->horizontalHeader()->sectionResizeMode(0), QHeaderView::Stretch);
+        // Text columns fit their contents; the number columns share the rest of the width.
+        QCOMPARE(f.view()->horizontalHeader()->sectionResizeMode(0), QHeaderView::ResizeToContents);
+        QCOMPARE(f.view()->horizontalHeader()->sectionResizeMode(2), QHeaderView::ResizeToContents);
+        QCOMPARE(f.view()->horizontalHeader()->sectionResizeMode(3), QHeaderView::Stretch);
+        QCOMPARE(f.view()->horizontalHeader()->sectionResizeMode(6), QHeaderView::Stretch);
         QCOMPARE(f.view()->verticalHeader()->defaultSectionSize(), 25);
         QCOMPARE(f.widget.windowTitle(), QStringLiteral("MultiColorValueWidget"));
         QCOMPARE(f.proxy()->rowCount(), 12);
@@ -316,8 +324,7 @@ private Q_SLOTS:
 
     void excelExportShouldWriteTheSelectedRows()
     {
-        if (!workbookReaderAvailable())
-            QSKIP("/usr/bin/python3 with openpyxl is needed to read the workbook back");
+        REQUIRE_PYTHON_MODULES(testprerequisites::workbookReaderModules());
         Fixture f;
         QTemporaryDir dir;
         const QString path = dir.filePath("colour.xlsx");
@@ -335,18 +342,19 @@ private Q_SLOTS:
         const int header = 5;
         QCOMPARE(cells.value(QStringLiteral("A%1").arg(header)).toObject().value("v").toString(),
                  QStringLiteral("Name"));
-        // Model rows 4 and 9 on the lines of their model positions.
-        QCOMPARE(cells.value(QStringLiteral("A%1").arg(header + 1 + 4)).toObject().value("v").toString(),
-                 QStringLiteral("T1"));
-        QCOMPARE(cells.value(QStringLiteral("B%1").arg(header + 1 + 4)).toObject().value("v").toString(),
+        // Model rows 4 and 9 on the lines of the rows the (sorted) view shows them in.
+        const int line4 = header + 1 + f.viewRow(4);
+        const int line9 = header + 1 + f.viewRow(9);
+        QVERIFY(line4 != header + 1 + 4 || line9 != header + 1 + 9);
+        QCOMPARE(cells.value(QStringLiteral("A%1").arg(line4)).toObject().value("v").toString(), QStringLiteral("T1"));
+        QCOMPARE(cells.value(QStringLiteral("B%1").arg(line4)).toObject().value("v").toString(),
                  QStringLiteral("45as45"));
-        QCOMPARE(cells.value(QStringLiteral("A%1").arg(header + 1 + 9)).toObject().value("v").toString(),
-                 QStringLiteral("T3"));
+        QCOMPARE(cells.value(QStringLiteral("A%1").arg(line9)).toObject().value("v").toString(), QStringLiteral("T3"));
         QVERIFY(!cells.contains(QStringLiteral("A%1").arg(header + 1)));
-        const QJsonObject verdict = cells.value(QStringLiteral("G%1").arg(header + 1 + 9)).toObject();
+        const QJsonObject verdict = cells.value(QStringLiteral("G%1").arg(line9)).toObject();
         QCOMPARE(verdict.value("fill").toString(),
                  f.model->index(9, 6).data(Qt::BackgroundRole).value<QColor>().name().mid(1).toUpper());
-        QCOMPARE(cells.value(QStringLiteral("D%1").arg(header + 1 + 4)).toObject().value("fmt").toString(),
+        QCOMPARE(cells.value(QStringLiteral("D%1").arg(line4)).toObject().value("fmt").toString(),
                  QStringLiteral("0.00"));
     }
 
@@ -417,6 +425,107 @@ private Q_SLOTS:
         QCOMPARE(selected.last().at(0).toInt(), 1);
         f.widget.clearSelections();
         QCOMPARE(selected.last().at(0).toInt(), 0);
+    }
+
+    // What the user sees is what is exported and printed: the view's sort order, without the
+    // columns the view hides.
+    void exportsAndPrintFollowTheView()
+    {
+        REQUIRE_PYTHON_MODULES(testprerequisites::workbookReaderModules());
+        Fixture f;
+        f.widget.onHeaderClicked(0);
+        f.widget.onHeaderClicked(0); // by name, descending: T3 first (the standard stays on top)
+        f.view()->setColumnHidden(1, true); // no Geometry column
+        QString expected = QStringLiteral("Name;Date/Time;L (D65/10);a (D65/10);b (D65/10);dE Set;\n");
+        const auto *proxy = f.proxy();
+        for (int r = 0; r < proxy->rowCount(); ++r) {
+            for (int c : {0, 2, 3, 4, 5, 6}) {
+                const QModelIndex index = proxy->index(r, c);
+                const QString verdict = TableCSVExporter::verdictOfBackground(index.data(Qt::BackgroundRole));
+                const QString text = index.data().toString();
+                expected += (verdict.isEmpty() ? text : text + " " + verdict) + ";";
+            }
+            expected += "\n";
+        }
+        const QString csv = f.widget.tableToCSVString();
+        QCOMPARE(csv, expected);
+        QVERIFY(csv.indexOf("\nT3;") < csv.indexOf("\nT1;"));
+        QVERIFY(!csv.contains("45as"));
+
+        QTemporaryDir dir;
+        const QString path = dir.filePath("shown.csv");
+        {
+            ChooseFile chooser(path);
+            f.widget.onExportToCSV();
+        }
+        QFile file(path);
+        QVERIFY(file.open(QIODevice::ReadOnly));
+        QCOMPARE(QString::fromUtf8(file.readAll().mid(3)), expected);
+
+        const QString book = dir.filePath("shown.xlsx");
+        {
+            ChooseFile chooser(book);
+            f.widget.onExportToExcel();
+        }
+        const QJsonObject cells = readWorkbook(book).value("Color Data").toObject().value("cells").toObject();
+        const int header = 5;
+        QCOMPARE(cells.value(QStringLiteral("B%1").arg(header)).toObject().value("v").toString(),
+                 QStringLiteral("Date/Time"));
+        QCOMPARE(cells.value(QStringLiteral("A%1").arg(header + 1 + 3)).toObject().value("v").toString(),
+                 QStringLiteral("T3"));
+
+        // The printed table: the same rows in the same order, every row, through the print dialog.
+        const QString pdf = dir.filePath("shown.pdf");
+        PrintToPdf print(pdf);
+        QVERIFY(f.widget.printTable());
+        QVERIFY(QFileInfo(pdf).size() > 500);
+        auto shown = f.widget.exportModel();
+        QCOMPARE(shown->columnCount(), 6);
+        QCOMPARE(shown->rowCount(), proxy->rowCount());
+        QCOMPARE(shown->index(3, 0).data().toString(), QStringLiteral("T3"));
+    }
+
+    // Black or white text, whichever reads better (WCAG 4.5:1 for normal text) on every verdict.
+    void verdictTextsAreReadable()
+    {
+        Fixture f;
+        int verdicts = 0;
+        for (int r = 0; r < f.model->rowCount(); ++r) {
+            const QModelIndex index = f.model->index(r, 6);
+            const QVariant background = index.data(Qt::BackgroundRole);
+            if (!background.isValid())
+                continue;
+            ++verdicts;
+            const QColor text = index.data(Qt::ForegroundRole).value<QColor>();
+            const double ratio = VerdictColors::contrastRatio(text, background.value<QColor>());
+            QVERIFY2(ratio >= 4.5, qPrintable(QStringLiteral("%1 on %2: %3:1")
+                                                  .arg(text.name(), background.value<QColor>().name())
+                                                  .arg(ratio, 0, 'f', 2)));
+        }
+        QCOMPARE(verdicts, 9);
+        for (const QColor &verdict : {VerdictColors::passColor(), VerdictColors::warningColor(), VerdictColors::failColor()})
+            QVERIFY(VerdictColors::contrastRatio(VerdictColors::readableTextColor(verdict), verdict) >= 4.5);
+    }
+
+    // Long trial names and dates are shown whole at the table's usual size, not elided.
+    void textColumnsShowWholeTexts()
+    {
+        Fixture f;
+        f.page.trials[1]->setName(QStringLiteral("Production batch 2024-11 line 3 after recoat"));
+        f.page.data->setTrials(f.page.trials);
+        f.widget.resize(900, 420);
+        f.widget.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&f.widget));
+        const QHeaderView *header = f.view()->horizontalHeader();
+        for (int c : {0, 2}) {
+            int widest = 0;
+            for (int r = 0; r < f.proxy()->rowCount(); ++r)
+                widest = std::max(widest, f.proxy()->index(r, c).data(Qt::SizeHintRole).toSize().width());
+            QVERIFY2(header->sectionSize(c) >= widest,
+                     qPrintable(QStringLiteral("column %1: %2 px for %3 px of text").arg(c).arg(header->sectionSize(c)).arg(widest)));
+        }
+        // The number columns still share the rest.
+        QVERIFY(header->sectionSize(3) > 40);
     }
 
     void uninitializedWidgetShouldNotCrash()

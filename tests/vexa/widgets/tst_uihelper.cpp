@@ -209,23 +209,29 @@ void TestUIHelper::displayColorFailures()
 
 void TestUIHelper::trialDisplayString_data()
 {
+    QTest::addColumn<QString>("name");
     QTest::addColumn<QString>("format");
     QTest::addColumn<QString>("expected");
 
-    QTest::newRow("day and month") << "<Name> <Day>.<Month>." << "T1 5.3.";
-    QTest::newRow("empty format") << "" << "T1";
-    QTest::newRow("time without zeros") << "<Hour>:<Minute>:<Second>" << "7:4:9";
-    QTest::newRow("year and repeats") << "<Name>/<Year>/<Name>" << "T1/2024/T1";
-    QTest::newRow("unknown placeholder kept") << "<Name>-<Color>" << "T1-<Color>";
-    QTest::newRow("no placeholder") << "fixed" << "fixed";
+    QTest::newRow("day and month") << "T1" << "<Name> <Day>.<Month>." << "T1 5.3.";
+    QTest::newRow("empty format") << "T1" << "" << "T1";
+    QTest::newRow("time without zeros") << "T1" << "<Hour>:<Minute>:<Second>" << "7:4:9";
+    QTest::newRow("year and repeats") << "T1" << "<Name>/<Year>/<Name>" << "T1/2024/T1";
+    QTest::newRow("unknown placeholder kept") << "T1" << "<Name>-<Color>" << "T1-<Color>";
+    QTest::newRow("no placeholder") << "T1" << "fixed" << "fixed";
+    // What a placeholder puts in is the trial's own text, never read as a placeholder again.
+    QTest::newRow("placeholder in the name") << "Batch <Year>" << "<Name> <Day>" << "Batch <Year> 5";
+    QTest::newRow("every placeholder in the name") << "<Name><Day><Second>" << "<Name>" << "<Name><Day><Second>";
+    QTest::newRow("half a placeholder") << "T1" << "<Na<Name>me>" << "<NaT1me>";
 }
 
 void TestUIHelper::trialDisplayString()
 {
+    QFETCH(QString, name);
     QFETCH(QString, format);
     QFETCH(QString, expected);
 
-    const auto trial = trialNamed(QStringLiteral("T1"), Timestamp(2024, 3, 5, 7, 4, 9));
+    const auto trial = trialNamed(name, Timestamp(2024, 3, 5, 7, 4, 9));
     QCOMPARE(UIHelper::trialDisplayString(trial, format), expected);
     QCOMPARE(UIHelper::trialDisplayString(std::shared_ptr<Trial>(), format), QString());
 }
