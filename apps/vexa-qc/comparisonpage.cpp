@@ -91,11 +91,12 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     m_table->initialize(m_tableModel, m_generalSettings, tr("Color Data"));
     m_flop = new FlopTableWidget(m_generalSettings, tables);
     m_flop->setObjectName(QStringLiteral("flopTable"));
+    m_flop->setMinimumWidth(290); // the trial names stay readable when the page is narrow
     tables->addWidget(m_table);
     tables->addWidget(m_flop);
-    tables->setStretchFactor(0, 3);
+    tables->setStretchFactor(0, 4);
     tables->setStretchFactor(1, 1);
-    tables->setSizes({740, 340});
+    tables->setSizes({820, 300});
 
     m_plot = new ColorPlotWidget(views);
     m_plot->setObjectName(QStringLiteral("colorPlot"));

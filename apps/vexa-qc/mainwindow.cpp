@@ -3,13 +3,18 @@
 #include "comparisonpage.h"
 #include "demojob.h"
 #include "recipepage.h"
+#include "storedock.h"
 
 #include <vexa/export/widgetprinter.h>
 #include <vexa/formula/recipewidgetsettings.h>
 #include <vexa/models/jobdetailviewsettings.h>
 #include <vexa/tables/multicolorvaluewidget.h>
+#include <vexa/browser/direntrybrowserwidget.h>
 
+#include <context/commanddispatcher.h>
+#include <context/corvidmodel.h>
 #include <domain/direntry.h>
+#include <domain/globaldirentry.h>
 #include <settings/generalsettings.h>
 #include <settings/settingsmanager.h>
 #include <settings/settingswidget.h>
@@ -18,6 +23,7 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QFileDialog>
+#include <QFileInfo>
 #include <QLabel>
 #include <QMenuBar>
 #include <QMessageBox>
@@ -42,6 +48,7 @@ MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
     , m_jobBox(new QComboBox(this))
     , m_statusLabel(new QLabel(this))
     , m_progress(new QProgressBar(this))
+    , m_storeDock(new StoreDock(m_session->corvidModel(), this))
 {
     setWindowTitle(tr("Vexa QC — colour comparison"));
     m_pages->setObjectName(QStringLiteral("pages"));
@@ -64,6 +71,7 @@ MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
     statusBar()->addWidget(m_statusLabel, 1);
     statusBar()->addPermanentWidget(m_progress);
 
+    buildStoreDock();
     buildMenus();
 
     connect(m_session, &StoreSession::sgOpened, m_session, &StoreSession::listJobs);
@@ -93,8 +101,12 @@ void MainWindow::buildMenus()
     file->addSeparator();
     file->addAction(tr("Quit"), qApp, &QApplication::quit, QKeySequence::Quit);
 
+    QMenu *objects = menuBar()->addMenu(tr("&Objects"));
+    m_storeDock->editedObjects()->createCustomMenus(objects, tr("Object"), tr("Objects"), true);
+
     QMenu *view = menuBar()->addMenu(tr("&View"));
     view->addAction(tr("View settings…"), this, &MainWindow::openSettings);
+    view->addAction(m_storeDock->toggleViewAction());
 }
 
 void MainWindow::openStore(const QString &storePath, const QString &jobName)
@@ -217,12 +229,35 @@ void MainWindow::printPlotsToPdf()
         showError(tr("%1 could not be written.").arg(file));
 }
 
+// The workstation's own store is browsed from the start; File ▸ Open store… adds another
+// one beside it (objects dragged between the two are copied).
 void MainWindow::chooseStore()
 {
     const QString file = QFileDialog::getOpenFileName(this, tr("Open object store"), QString(),
                                                       tr("Object stores (*.vexastore);;All files (*)"));
-    if (!file.isEmpty())
-        openStore(file);
+    if (file.isEmpty())
+        return;
+    CommandDispatcher *dispatcher = m_session->corvidModel()->createCommandDispatcher(
+        ServerId(QFileInfo(file).absoluteFilePath().toStdString(), 0));
+    m_storeDock->addStore(dispatcher->dispatcherId(), true);
+    m_storeDock->show();
+}
+
+void MainWindow::buildStoreDock()
+{
+    addDockWidget(Qt::LeftDockWidgetArea, m_storeDock);
+    resizeDocks({m_storeDock}, {400}, Qt::Horizontal);
+    connect(m_storeDock, &StoreDock::sgObjectActivated, m_storeDock, &StoreDock::openEntry);
+    connect(m_storeDock, &StoreDock::sgOpenJob, this, [this](std::shared_ptr<GlobalDirEntry> entry) {
+        const int known = m_jobBox->findText(entry->header().name());
+        if (known >= 0)
+            m_jobBox->setCurrentIndex(known);
+        m_session->loadJob(entry);
+    });
+    connect(m_storeDock->editedObjects(), &DirEntryBrowserWidget::sgErrorOccurred, this,
+            [this](const QString &message) { m_statusLabel->setText(message); });
+    connect(m_session, &StoreSession::sgOpened, this,
+            [this] { m_storeDock->addStore(m_session->dispatcher()->dispatcherId(), false); });
 }
 
 } // namespace vexa

@@ -17,6 +17,7 @@ namespace vexa {
 
 class BaseObject;
 class ComparisonPage;
+class StoreDock;
 class JobDetailViewSettings;
 class RecipePage;
 class RecipeWidgetSettings;
@@ -43,6 +44,7 @@ public:
     bool showPage(const QString &name);
     StoreSession *session() const { return m_session; }
     QComboBox *jobBox() const { return m_jobBox; }
+    StoreDock *storeDock() const { return m_storeDock; }
 
     // Message boxes go through here so that headless runs can log them instead.
     // Shows every job grown to this many trials (0: as stored); see enlargeJob().
@@ -71,6 +73,7 @@ private:
     void printTable();
     void printPlotsToPdf();
     void chooseStore();
+    void buildStoreDock();
 
     std::shared_ptr<GeneralSettings> m_generalSettings;
     std::shared_ptr<JobDetailViewSettings> m_viewSettings;
@@ -81,6 +84,7 @@ private:
     QComboBox *m_jobBox;            // Child.
     QLabel *m_statusLabel;          // Child.
     QProgressBar *m_progress;       // Child.
+    StoreDock *m_storeDock;         // Child.
     std::vector<std::shared_ptr<DirEntry>> m_jobs;
     QString m_wantedJob;
     MessageSink m_messageSink;

@@ -12,6 +12,7 @@
 #include <domain/direntry.h>
 #include <domain/folder.h>
 #include <domain/formula.h>
+#include <domain/globaldirentry.h>
 #include <domain/qcjob.h>
 #include <domain/recipetrial.h>
 #include <domain/toleranceset.h>
@@ -195,7 +196,11 @@ void StoreSession::loadFormulas()
 
 void StoreSession::loadJob(const std::shared_ptr<DirEntry> &entry)
 {
-    CommandDispatcher *d = dispatcher();
+    // A job picked in another store's browser is read from that store.
+    const auto global = std::dynamic_pointer_cast<GlobalDirEntry>(entry);
+    CommandDispatcher *d = global && !global->dispatcherID().isEmpty()
+        ? m_corvidModel->commandDispatcher(global->dispatcherID().toStdString())
+        : dispatcher();
     if (!d || !entry) {
         Q_EMIT sgError(tr("No object store is open."));
         return;

@@ -8,6 +8,7 @@
 #include <vexa/plots/textitem.h>
 #include <vexa/plots/trialgraphicsitem.h>
 #include <vexa/plots/zoomgraphicsview.h>
+#include <vexa/widgets/verdictcolors.h>
 #include <vexa/widgets/uihelper.h>
 
 #include <colorimetry/colorconverter.h>
@@ -253,16 +254,8 @@ QColor PlotWidget::labelColorFor(const QColor &background)
 
 QColor PlotWidget::verdictColor(int status)
 {
-    switch (status) {
-    case 1:
-        return QColor(QStringLiteral("#00914d"));
-    case 2:
-        return QColor(QStringLiteral("#F2E000"));
-    case 3:
-        return QColor(QStringLiteral("#FF3D35"));
-    default:
-        return QColor(130, 130, 130);
-    }
+    const QColor verdict = VerdictColors::colorOfStatus(status);
+    return verdict.isValid() ? verdict : QColor(130, 130, 130);
 }
 
 QVector<double> PlotWidget::tickValues(double min, double max, int count)

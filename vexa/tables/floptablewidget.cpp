@@ -8,6 +8,7 @@
 #include <domain/trial.h>
 
 #include <QCheckBox>
+#include <QFontMetrics>
 #include <QHeaderView>
 #include <QLocale>
 #include <QTableView>
@@ -75,16 +76,21 @@ FlopTableWidget::FlopTableWidget(std::shared_ptr<GeneralSettings> generalSetting
     m_view->verticalHeader()->hide();
     m_view->verticalHeader()->setDefaultSectionSize(25);
     m_view->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    // The names take what the numbers leave. The number columns are as wide as their
-    // headers: sizing them to their contents would compute every row's flop index.
+    // The names take what the numbers leave. The number columns are as wide as a number or a
+    // line of their wrapped header ("ΔFlop-" / "index"): sizing them to their contents would
+    // compute every row's flop index.
     QHeaderView *header = m_view->horizontalHeader();
+    header->setDefaultAlignment(Qt::Alignment(int(Qt::AlignCenter) | int(Qt::TextWordWrap)));
     header->setSectionResizeMode(QHeaderView::Interactive);
     header->setSectionResizeMode(FlopTableModel::NameColumn, QHeaderView::Stretch);
+    const QFontMetrics metrics = header->fontMetrics();
     for (int column : {int(FlopTableModel::FlopDifferenceColumn), int(FlopTableModel::FlopColumn)}) {
-        const QString text = m_model->headerData(column, Qt::Horizontal).toString();
-        header->resizeSection(column, header->fontMetrics().horizontalAdvance(text) + 14);
+        int width = metrics.horizontalAdvance(QStringLiteral("-00.00"));
+        for (const QString &part : m_model->headerData(column, Qt::Horizontal).toString().split(QLatin1Char('-')))
+            width = std::max(width, metrics.horizontalAdvance(part + QLatin1Char('-')));
+        header->resizeSection(column, width + 16);
     }
-    m_view->horizontalHeader()->setHighlightSections(false);
+    header->setMinimumHeight(2 * metrics.lineSpacing() + 10);
 
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);

@@ -196,17 +196,13 @@ void UIHelper::setObjectSortOrder(const QString &type, SortOrder order)
     sortOrders().insert(type, order);
 }
 
-std::vector<std::shared_ptr<BaseObject>> UIHelper::baseObjectsFromMimeData(const QMimeData *mimeData)
+std::vector<QMap<int, QVariant>> UIHelper::itemDataFromMimeData(const QMimeData *mimeData)
 {
-    std::vector<std::shared_ptr<BaseObject>> objects;
+    std::vector<QMap<int, QVariant>> cells;
     if (!mimeData || !mimeData->hasFormat(itemModelMimeType()))
-        return objects;
+        return cells;
     // The stream operators of the object pointers must be known to read the variants.
     registerDomainMetaTypes();
-    const int objectType = QMetaType::type("std::shared_ptr<vexa::BaseObject>");
-    if (objectType == QMetaType::UnknownType)
-        return objects;
-
     QByteArray encoded = mimeData->data(itemModelMimeType());
     QDataStream stream(&encoded, QIODevice::ReadOnly);
     while (!stream.atEnd()) {
@@ -216,6 +212,19 @@ std::vector<std::shared_ptr<BaseObject>> UIHelper::baseObjectsFromMimeData(const
         stream >> row >> column >> roles;
         if (stream.status() != QDataStream::Ok)
             break;
+        cells.push_back(std::move(roles));
+    }
+    return cells;
+}
+
+std::vector<std::shared_ptr<BaseObject>> UIHelper::baseObjectsFromMimeData(const QMimeData *mimeData)
+{
+    std::vector<std::shared_ptr<BaseObject>> objects;
+    const std::vector<QMap<int, QVariant>> cells = itemDataFromMimeData(mimeData);
+    const int objectType = QMetaType::type("std::shared_ptr<vexa::BaseObject>");
+    if (objectType == QMetaType::UnknownType)
+        return objects;
+    for (const QMap<int, QVariant> &roles : cells) {
         QVariant value = roles.value(Qt::UserRole);
         if (!value.isValid() || !value.canConvert(objectType) || !value.convert(objectType))
             continue;

@@ -5,6 +5,8 @@
 #include <QColor>
 #include <QCoreApplication>
 #include <QIcon>
+#include <QMap>
+#include <QVariant>
 #include <QSize>
 #include <QString>
 
@@ -69,6 +71,9 @@ public:
     // taken from each cell's Qt::UserRole value, in stream order. Cells without an
     // object are skipped; null or foreign data give an empty list.
     static std::vector<std::shared_ptr<BaseObject>> baseObjectsFromMimeData(const QMimeData *mimeData);
+    // The cells of an item-model drag, each as its map of role to value, in stream order;
+    // empty for null or foreign data.
+    static std::vector<QMap<int, QVariant>> itemDataFromMimeData(const QMimeData *mimeData);
 };
 
 } // namespace vexa
