@@ -16,6 +16,7 @@ namespace vexa {
 
 class AppearanceViewDataModel;
 class ColorPlotWidget;
+class FlopTableWidget;
 class JobDetailViewSettings;
 class MultiColorValueTableModel;
 class MultiColorValueWidget;
@@ -27,7 +28,7 @@ struct LoadedJob;
 
 // One comparison page: the trials of a job with check boxes (the active trials), the
 // geometry filter, the colorimetric condition and the ΔE formula on the left; the
-// colour table and the colour plots on the right. Every view shares the page's one
+// colour table with the flop table beside it and the colour plots on the right. Every view shares the page's one
 // data model and one selection model.
 class ComparisonPage : public QWidget
 {
@@ -42,6 +43,7 @@ public:
     std::shared_ptr<AppearanceViewDataModel> dataModel() const { return m_dataModel; }
     std::shared_ptr<TrialSelectionModel> selectionModel() const { return m_selectionModel; }
     MultiColorValueWidget *tableWidget() const { return m_table; }
+    FlopTableWidget *flopWidget() const { return m_flop; }
     ColorPlotWidget *plotWidget() const { return m_plot; }
     QListWidget *trialList() const { return m_trialList; }
     QListWidget *geometryList() const { return m_geometryList; }
@@ -77,6 +79,7 @@ private:
     ToleranceSelector *m_toleranceSelector = nullptr;
     QLabel *m_toleranceWarning = nullptr;
     MultiColorValueWidget *m_table = nullptr;
+    FlopTableWidget *m_flop = nullptr;
     ColorPlotWidget *m_plot = nullptr;
     std::vector<std::shared_ptr<Trial>> m_trials;
     bool m_updating = false;

@@ -1,5 +1,11 @@
 #include "comparisonpage.h"
 #include "mainwindow.h"
+#include "recipepage.h"
+
+#include <vexa/formula/formulatablemodel.h>
+#include <vexa/formula/formulawidget.h>
+#include <vexa/tables/floptablemodel.h>
+#include <vexa/tables/floptablewidget.h>
 
 #include <vexa/models/appearanceviewdatamodel.h>
 #include <vexa/models/jobdetailviewsettings.h>
@@ -11,7 +17,10 @@
 #include <vexa/tables/multicolorvaluetablemodel.h>
 #include <vexa/tables/multicolorvaluewidget.h>
 
+#include <domain/colorant.h>
 #include <domain/domainmetatypes.h>
+#include <domain/formula.h>
+#include <domain/recipetrial.h>
 #include <domain/qcjob.h>
 #include <domain/tolerance.h>
 #include <domain/toleranceset.h>
@@ -48,6 +57,8 @@ private Q_SLOTS:
     void pageShowsTheFirstJob();
     void tableAndPlotFollowTheTrialList();
     void tableAndPlotFollowTheGeometryFilter();
+    void flopTableFollowsTheSelection();
+    void recipePageShowsTheStoresFormulas();
     void anotherJobReplacesThePage();
     void toleranceSetThatCannotJudgeSaysWhy();
     void batchJudgeWritesTheWorkbook();
@@ -134,6 +145,55 @@ void tst_VexaQc::tableAndPlotFollowTheTrialList()
     page->trialList()->item(7)->setCheckState(Qt::Unchecked);
     QVERIFY(!page->selectionModel()->isActive(trials[7]));
     QCOMPARE(page->tableWidget()->tableModel()->rowCount(), before - 6);
+}
+
+// The flop table beside the colour table lists the standard and every trial, judges the
+// flop with the automotive ΔE set's flop tolerance while the page shows the CIELab set, and
+// selects the row of the trial selected in the list.
+void tst_VexaQc::flopTableFollowsTheSelection()
+{
+    ComparisonPage *page = m_window->page();
+    FlopTableWidget *flop = page->flopWidget();
+    QVERIFY(flop);
+    const auto trials = page->dataModel()->trials();
+    QCOMPARE(flop->tableModel()->rowCount(), 1 + int(trials.size()));
+    QVERIFY(flop->tableModel()->flopTolerance());
+    QVERIFY(flop->tableModel()->index(1, FlopTableModel::FlopDifferenceColumn).data(Qt::BackgroundRole).isValid());
+    page->trialList()->setCurrentRow(6);
+    const QModelIndexList selected = flop->tableView()->selectionModel()->selectedRows();
+    QCOMPARE(selected.size(), 1);
+    QCOMPARE(selected.first().row(), 7);
+    QCOMPARE(flop->tableModel()->trialAt(7), trials[6]);
+}
+
+// The "Recipe" page lists the three recipes (first trial and correction) and the three
+// formulas of the sample store, with their colorants loaded: amounts in any unit.
+void tst_VexaQc::recipePageShowsTheStoresFormulas()
+{
+    RecipePage *recipes = m_window->recipePage();
+    QTRY_COMPARE(recipes->recipeList()->count(), 6);
+    QCOMPARE(recipes->recipeList()->item(0)->text(), QStringLiteral("Silver Metallic Recipe"));
+    QCOMPARE(recipes->recipeList()->item(3)->text(), QStringLiteral("Silver Metallic"));
+    QCOMPARE(recipes->recipes().front().size(), size_t(2));
+    QVERIFY(m_window->showPage("recipe"));
+    QVERIFY(!m_window->showPage("spectra"));
+
+    FormulaWidget *widget = recipes->formulaWidget();
+    FormulaTableModel *model = widget->tableModel();
+    QCOMPARE(model->recipeTrial()->name(), QStringLiteral("Silver Metallic Correction 1"));
+    QCOMPARE(model->rowCount(), 4);
+    widget->setUnit(FormulaUnits::FluidOunce);
+    const int amount = model->columnOfKind(FormulaTableModel::ColumnKind::Amount);
+    QCOMPARE(model->headerData(amount, Qt::Horizontal).toString(), QStringLiteral("Amount (fl oz)"));
+    QCOMPARE(model->colorantAt(0)->name(), QStringLiteral("Clear Binder"));
+    // 61 g of Clear Binder (1.02 g/ml) in fluid ounces.
+    QVERIFY(std::fabs(model->valueAt(0, FormulaTableModel::ColumnKind::Amount) - 61.0 / 1.02 / 29.5735) < 1e-9);
+    QVERIFY(model->problems().isEmpty());
+
+    recipes->recipeList()->setCurrentRow(5);
+    QCOMPARE(model->formula()->name(), QStringLiteral("Red Solid"));
+    widget->setUnit(FormulaUnits::Gram);
+    QVERIFY(m_window->showPage("comparison"));
 }
 
 void tst_VexaQc::tableAndPlotFollowTheGeometryFilter()
