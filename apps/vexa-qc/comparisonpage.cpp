@@ -12,6 +12,7 @@
 #include <vexa/plots/absolutecolorplotl.h>
 #include <vexa/plots/colorplotsettings.h>
 #include <vexa/plots/colorplotwidget.h>
+#include <vexa/tables/floptablewidget.h>
 #include <vexa/tables/multicolorvaluetablemodel.h>
 #include <vexa/tables/multicolorvaluewidget.h>
 #include <vexa/tolerance/toleranceselector.h>
@@ -88,9 +89,18 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     m_tabs->setObjectName(QStringLiteral("viewTabs"));
     auto *views = new QSplitter(Qt::Vertical, m_tabs);
     m_tableModel = std::make_shared<MultiColorValueTableModel>(m_viewSettings->colorCompareSettings(), m_generalSettings);
-    m_table = new MultiColorValueWidget(views);
+    auto *tables = new QSplitter(Qt::Horizontal, views);
+    m_table = new MultiColorValueWidget(tables);
     m_table->setObjectName(QStringLiteral("colorTable"));
     m_table->initialize(m_tableModel, m_generalSettings, tr("Color Data"));
+    m_flop = new FlopTableWidget(m_generalSettings, tables);
+    m_flop->setObjectName(QStringLiteral("flopTable"));
+    m_flop->setMinimumWidth(290); // the trial names stay readable when the page is narrow
+    tables->addWidget(m_table);
+    tables->addWidget(m_flop);
+    tables->setStretchFactor(0, 4);
+    tables->setStretchFactor(1, 1);
+    tables->setSizes({820, 300});
 
     m_plot = new ColorPlotWidget(views);
     m_plot->setObjectName(QStringLiteral("colorPlot"));
@@ -101,7 +111,7 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     l->initialize(plotSettings);
     m_plot->initialize(ab, l);
 
-    views->addWidget(m_table);
+    views->addWidget(tables);
     views->addWidget(m_plot);
     views->setStretchFactor(0, 1);
     views->setStretchFactor(1, 1);
@@ -127,6 +137,7 @@ ComparisonPage::ComparisonPage(std::shared_ptr<GeneralSettings> generalSettings,
     layout->addWidget(splitter, 1);
 
     m_table->setModels(m_dataModel, m_selectionModel);
+    m_flop->setModels(m_dataModel, m_selectionModel);
     m_plot->setModels(m_dataModel, m_selectionModel);
     m_spectral->setModels(m_dataModel, m_selectionModel);
     m_toleranceSelector->setDataModel(m_dataModel);
@@ -338,6 +349,7 @@ void ComparisonPage::onFormulaChosen()
 void ComparisonPage::settingsChanged()
 {
     m_table->settingsChanged();
+    m_flop->settingsChanged();
     m_plot->settingsChanged();
     m_spectral->settingsChanged();
 }

@@ -17,6 +17,7 @@ namespace vexa {
 
 class AppearanceViewDataModel;
 class ColorPlotWidget;
+class FlopTableWidget;
 class JobDetailViewSettings;
 class MultiColorValueTableModel;
 class MultiColorValueWidget;
@@ -29,9 +30,9 @@ struct LoadedJob;
 
 // One comparison page: the trials of a job with check boxes (the active trials), the
 // geometry filter, the colorimetric condition and the ΔE formula on the left; on the
-// right the views in tabs: "Colour" (the colour table and the colour plots) and
-// "Spectra" (the spectral page). Every view shares the page's one data model and one
-// selection model.
+// right the views in tabs: "Colour" (the colour table with the flop table beside it and
+// the colour plots) and "Spectra" (the spectral page). Every view shares the page's one
+// data model and one selection model.
 class ComparisonPage : public QWidget
 {
     Q_OBJECT
@@ -45,6 +46,7 @@ public:
     std::shared_ptr<AppearanceViewDataModel> dataModel() const { return m_dataModel; }
     std::shared_ptr<TrialSelectionModel> selectionModel() const { return m_selectionModel; }
     MultiColorValueWidget *tableWidget() const { return m_table; }
+    FlopTableWidget *flopWidget() const { return m_flop; }
     ColorPlotWidget *plotWidget() const { return m_plot; }
     SpectralPage *spectralPage() const { return m_spectral; }
     QTabWidget *viewTabs() const { return m_tabs; }
@@ -84,6 +86,7 @@ private:
     ToleranceSelector *m_toleranceSelector = nullptr;
     QLabel *m_toleranceWarning = nullptr;
     MultiColorValueWidget *m_table = nullptr;
+    FlopTableWidget *m_flop = nullptr;
     ColorPlotWidget *m_plot = nullptr;
     SpectralPage *m_spectral = nullptr;
     QTabWidget *m_tabs = nullptr;

@@ -4,6 +4,7 @@
 #include "mainwindow.h"
 #include "storesession.h"
 
+#include <vexa/formula/recipewidgetsettings.h>
 #include <vexa/models/jobdetailviewsettings.h>
 
 #include <domain/domainmetatypes.h>
@@ -24,6 +25,7 @@
 #include <QTimer>
 
 #include <cstdio>
+#include <memory>
 
 using namespace vexa;
 
@@ -81,8 +83,9 @@ int main(int argc, char **argv)
                                         QStringLiteral("Render the window with the job to FILE (PNG) and exit."),
                                         QStringLiteral("FILE"));
     QCommandLineOption pageOption(QStringLiteral("page"),
-                                  QStringLiteral("The views shown first: colour (default) or spectra."),
-                                  QStringLiteral("NAME"), QStringLiteral("colour"));
+                                  QStringLiteral("The page to show: comparison (default; its colour views), "
+                                                 "spectra (the comparison's spectral views) or recipe."),
+                                  QStringLiteral("PAGE"), QStringLiteral("comparison"));
     QCommandLineOption judgeOption(QStringLiteral("judge"),
                                    QStringLiteral("Batch mode: judge every trial of the job and exit (0 no trial fails, 1 some fail, 2 error)."),
                                    QStringLiteral("JOB"));
@@ -95,7 +98,7 @@ int main(int argc, char **argv)
                                     QStringLiteral("Show the job grown to N trials (its own, repeated with small "
                                                    "changes; in memory only), for demonstrations and measurements."),
                                     QStringLiteral("N"));
-    parser.addOptions({storeOption, jobOption, screenshotOption, pageOption, judgeOption, xlsxOption, conditionOption,
+    parser.addOptions({storeOption, jobOption, pageOption, screenshotOption, judgeOption, xlsxOption, conditionOption,
                        trialsOption});
     parser.process(app);
 
@@ -115,14 +118,16 @@ int main(int argc, char **argv)
     ToleranceFactory::toleranceFactory();
     auto viewSettings = std::make_shared<JobDetailViewSettings>();
     SettingsManager::instance().registerClientSettings(viewSettings);
+    auto recipeSettings = std::make_shared<RecipeWidgetSettings>();
+    SettingsManager::instance().registerClientSettings(recipeSettings);
     auto generalSettings = SettingsManager::instance().getGeneralSettings();
 
-    MainWindow window(generalSettings, viewSettings);
-    if (!window.page()->showViews(parser.value(pageOption))) {
-        err << "--page: unknown page \"" << parser.value(pageOption) << "\" (colour, spectra)\n";
+    MainWindow window(generalSettings, viewSettings, recipeSettings);
+    window.setTrialCount(parser.value(trialsOption).toInt());
+    if (!window.showPage(parser.value(pageOption))) {
+        err << "--page must be comparison, spectra or recipe\n";
         return 2;
     }
-    window.setTrialCount(parser.value(trialsOption).toInt());
     auto *watcher = new FirstPaintWatcher(clock, &app);
     window.page()->installEventFilter(watcher);
     QObject::connect(&window, &MainWindow::sgJobShown, watcher, [watcher] { watcher->armed = true; });
@@ -136,7 +141,12 @@ int main(int argc, char **argv)
             exitCode = 2;
         });
         window.resize(1500, 940);
-        QObject::connect(&window, &MainWindow::sgJobShown, &window, [&window, file] {
+        // The page is ready when its data is shown: the job, or the formulas.
+        auto done = std::make_shared<bool>(false);
+        const auto grab = [&window, file, done] {
+            if (*done)
+                return;
+            *done = true;
             // Give the plots' worker threads time to hand back their tolerance regions.
             QTimer::singleShot(2500, &window, [&window, file] {
                 const QImage image = window.grab().toImage();
@@ -145,7 +155,11 @@ int main(int argc, char **argv)
                              qPrintable(file));
                 QApplication::exit(saved ? 0 : 2);
             });
-        });
+        };
+        if (parser.value(pageOption) == QLatin1String("recipe"))
+            QObject::connect(&window, &MainWindow::sgFormulasShown, &window, grab);
+        else
+            QObject::connect(&window, &MainWindow::sgJobShown, &window, grab);
         // A store that never answers must not keep a headless run alive.
         QTimer::singleShot(90000, &app, [] {
             std::fprintf(stderr, "vexa-qc: no job was shown within 90 s\n");

@@ -2,9 +2,11 @@
 
 #include "comparisonpage.h"
 #include "demojob.h"
+#include "recipepage.h"
 #include "storedock.h"
 
 #include <vexa/export/widgetprinter.h>
+#include <vexa/formula/recipewidgetsettings.h>
 #include <vexa/models/jobdetailviewsettings.h>
 #include <vexa/tables/multicolorvaluewidget.h>
 #include <vexa/browser/direntrybrowserwidget.h>
@@ -21,30 +23,40 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QFileDialog>
+#include <QTimer>
 #include <QFileInfo>
 #include <QLabel>
 #include <QMenuBar>
 #include <QMessageBox>
 #include <QProgressBar>
 #include <QStatusBar>
+#include <QTabWidget>
 #include <QToolBar>
 
 namespace vexa {
 
 MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
-                       std::shared_ptr<JobDetailViewSettings> viewSettings, QWidget *parent)
+                       std::shared_ptr<JobDetailViewSettings> viewSettings,
+                       std::shared_ptr<RecipeWidgetSettings> recipeSettings, QWidget *parent)
     : QMainWindow(parent)
     , m_generalSettings(std::move(generalSettings))
     , m_viewSettings(std::move(viewSettings))
     , m_session(new StoreSession(this))
-    , m_page(new ComparisonPage(m_generalSettings, m_viewSettings, this))
+    , m_pages(new QTabWidget(this))
+    , m_page(new ComparisonPage(m_generalSettings, m_viewSettings, m_pages))
+    , m_recipePage(new RecipePage(recipeSettings ? std::move(recipeSettings) : std::make_shared<RecipeWidgetSettings>(),
+                                  m_pages))
     , m_jobBox(new QComboBox(this))
     , m_statusLabel(new QLabel(this))
     , m_progress(new QProgressBar(this))
     , m_storeDock(new StoreDock(m_session->corvidModel(), this))
 {
     setWindowTitle(tr("Vexa QC — colour comparison"));
-    setCentralWidget(m_page);
+    m_pages->setObjectName(QStringLiteral("pages"));
+    m_pages->setDocumentMode(true);
+    m_pages->addTab(m_page, tr("Comparison"));
+    m_pages->addTab(m_recipePage, tr("Recipe"));
+    setCentralWidget(m_pages);
 
     auto *toolbar = addToolBar(tr("Job"));
     toolbar->setObjectName(QStringLiteral("jobToolbar"));
@@ -64,6 +76,9 @@ MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
     buildMenus();
 
     connect(m_session, &StoreSession::sgOpened, m_session, &StoreSession::listJobs);
+    connect(m_session, &StoreSession::sgOpened, m_session, &StoreSession::loadFormulas);
+    connect(m_session, &StoreSession::sgFormulasLoaded, this, &MainWindow::onFormulasLoaded);
+    connect(m_recipePage, &RecipePage::sgFormulasShown, this, &MainWindow::sgFormulasShown);
     connect(m_session, &StoreSession::sgJobsListed, this, &MainWindow::onJobsListed);
     connect(m_session, &StoreSession::sgJobLoaded, this, &MainWindow::onJobLoaded);
     connect(m_session, &StoreSession::sgError, this, &MainWindow::showError);
@@ -142,6 +157,24 @@ void MainWindow::onJobLoaded(const LoadedJob &loaded)
     Q_EMIT sgJobShown();
 }
 
+void MainWindow::onFormulasLoaded(const std::vector<std::shared_ptr<BaseObject>> &objects)
+{
+    m_recipePage->showFormulas(objects);
+}
+
+bool MainWindow::showPage(const QString &name)
+{
+    if (name == QLatin1String("recipe")) {
+        m_pages->setCurrentWidget(m_recipePage);
+        return true;
+    }
+    // "comparison" shows its colour views; the names of its view tabs show that tab.
+    if (!m_page->showViews(name == QLatin1String("comparison") ? QStringLiteral("colour") : name))
+        return false;
+    m_pages->setCurrentWidget(m_page);
+    return true;
+}
+
 void MainWindow::showError(const QString &message)
 {
     Logger::instance().error(LogCategory::General, QStringLiteral("MainWindow: ") + message);
@@ -216,7 +249,10 @@ void MainWindow::chooseStore()
 void MainWindow::buildStoreDock()
 {
     addDockWidget(Qt::LeftDockWidgetArea, m_storeDock);
-    resizeDocks({m_storeDock}, {400}, Qt::Horizontal);
+    // Narrow by default: the comparison page is the daily work. Sized again once laid out,
+    // since a dock's size before the first layout does not hold.
+    resizeDocks({m_storeDock}, {270}, Qt::Horizontal);
+    QTimer::singleShot(0, this, [this] { resizeDocks({m_storeDock}, {270}, Qt::Horizontal); });
     connect(m_storeDock, &StoreDock::sgObjectActivated, m_storeDock, &StoreDock::openEntry);
     connect(m_storeDock, &StoreDock::sgOpenJob, this, [this](std::shared_ptr<GlobalDirEntry> entry) {
         const int known = m_jobBox->findText(entry->header().name());

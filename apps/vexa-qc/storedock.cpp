@@ -81,6 +81,8 @@ ObjectBrowserWidget *StoreDock::addStore(const std::string &dispatcherId, bool c
     browser->initialize(m_corvidModel, dispatcherId);
     browser->setFolderPickerSettings(m_favourites);
     browser->setCaption(QFileInfo(QString::fromStdString(dispatcherId)).fileName());
+    // A dock is narrow: the folders above their contents leaves the comparison page its width.
+    browser->setOrientation(Qt::Vertical);
     browser->setToolTip(QString::fromStdString(dispatcherId));
     if (closable) {
         auto *close = new QToolButton(browser);

@@ -11,8 +11,10 @@
 #include <context/serverid.h>
 #include <domain/direntry.h>
 #include <domain/folder.h>
+#include <domain/formula.h>
 #include <domain/globaldirentry.h>
 #include <domain/qcjob.h>
+#include <domain/recipetrial.h>
 #include <domain/toleranceset.h>
 #include <sampledata/sampledata.h>
 #include <store/errorinfo.h>
@@ -34,6 +36,7 @@ StoreSession::StoreSession(QObject *parent)
 {
     qRegisterMetaType<vexa::LoadedJob>();
     qRegisterMetaType<std::vector<std::shared_ptr<vexa::DirEntry>>>();
+    qRegisterMetaType<std::vector<std::shared_ptr<vexa::BaseObject>>>();
 }
 
 StoreSession::~StoreSession() = default;
@@ -113,7 +116,7 @@ void StoreSession::reportError(const QString &operation, const std::shared_ptr<E
     Q_EMIT sgError(tr("Error occured during %1: %2").arg(operation, text));
 }
 
-void StoreSession::listJobs()
+void StoreSession::findFolder(const QString &name, std::function<void(const QString &)> found)
 {
     CommandDispatcher *d = dispatcher();
     if (!d) {
@@ -124,29 +127,71 @@ void StoreSession::listJobs()
     root->setType(Folder::typeId());
     d->execute(
         root, this,
-        [this](std::shared_ptr<Response> response) {
+        [name, found](std::shared_ptr<Response> response) {
             auto listing = std::dynamic_pointer_cast<GetDirEntriesResponse>(response);
-            QString jobsFolder;
+            QString folder;
             for (const auto &entry : listing ? listing->dirEntries() : std::vector<std::shared_ptr<DirEntry>>{}) {
-                if (entry->header().name() == QLatin1String("QC Jobs"))
-                    jobsFolder = entry->entryObjectId();
+                if (entry->header().name() == name)
+                    folder = entry->entryObjectId();
             }
-            if (jobsFolder.isEmpty()) {
-                Q_EMIT sgJobsListed({});
-                return;
-            }
-            auto jobs = std::make_shared<GetDirEntries>();
-            jobs->setParentFolderId(jobsFolder);
-            jobs->setType(QCJob::typeId());
-            dispatcher()->execute(
-                jobs, this,
-                [this](std::shared_ptr<Response> answer) {
-                    auto list = std::dynamic_pointer_cast<GetDirEntriesResponse>(answer);
-                    Q_EMIT sgJobsListed(list ? list->dirEntries() : std::vector<std::shared_ptr<DirEntry>>{});
-                },
-                [this](std::shared_ptr<ErrorInfo> error) { reportError(QStringLiteral("GetDirEntries"), error); });
+            found(folder);
         },
         [this](std::shared_ptr<ErrorInfo> error) { reportError(QStringLiteral("GetDirEntries"), error); });
+}
+
+void StoreSession::listJobs()
+{
+    findFolder(QStringLiteral("QC Jobs"), [this](const QString &jobsFolder) {
+        if (jobsFolder.isEmpty()) {
+            Q_EMIT sgJobsListed({});
+            return;
+        }
+        auto jobs = std::make_shared<GetDirEntries>();
+        jobs->setParentFolderId(jobsFolder);
+        jobs->setType(QCJob::typeId());
+        dispatcher()->execute(
+            jobs, this,
+            [this](std::shared_ptr<Response> answer) {
+                auto list = std::dynamic_pointer_cast<GetDirEntriesResponse>(answer);
+                Q_EMIT sgJobsListed(list ? list->dirEntries() : std::vector<std::shared_ptr<DirEntry>>{});
+            },
+            [this](std::shared_ptr<ErrorInfo> error) { reportError(QStringLiteral("GetDirEntries"), error); });
+    });
+}
+
+void StoreSession::loadFormulas()
+{
+    findFolder(QStringLiteral("Formulas"), [this](const QString &folder) {
+        if (folder.isEmpty()) {
+            Q_EMIT sgFormulasLoaded({});
+            return;
+        }
+        auto list = std::make_shared<GetDirEntries>();
+        list->setParentFolderId(folder);
+        list->setTypes({Formula::typeId(), RecipeTrial::typeId()});
+        dispatcher()->execute(
+            list, this,
+            [this](std::shared_ptr<Response> answer) {
+                auto listing = std::dynamic_pointer_cast<GetDirEntriesResponse>(answer);
+                const auto entries = listing ? listing->dirEntries() : std::vector<std::shared_ptr<DirEntry>>{};
+                if (entries.empty()) {
+                    Q_EMIT sgFormulasLoaded({});
+                    return;
+                }
+                Q_EMIT sgBusy(tr("Loading formulas"), true);
+                FullObjectLoader::collect(
+                    dispatcher(), entries, nullptr, this,
+                    [this](std::vector<std::shared_ptr<BaseObject>> objects) {
+                        Q_EMIT sgBusy(tr("Loading formulas"), false);
+                        Q_EMIT sgFormulasLoaded(objects);
+                    },
+                    [this](std::shared_ptr<ErrorInfo> error) {
+                        Q_EMIT sgBusy(tr("Loading formulas"), false);
+                        reportError(QStringLiteral("GetCorvidObjects"), error);
+                    });
+            },
+            [this](std::shared_ptr<ErrorInfo> error) { reportError(QStringLiteral("GetDirEntries"), error); });
+    });
 }
 
 void StoreSession::loadJob(const std::shared_ptr<DirEntry> &entry)

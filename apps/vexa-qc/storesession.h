@@ -1,8 +1,11 @@
 #pragma once
 
+#include <context/fullobjectloader.h>
+
 #include <QObject>
 #include <QString>
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
@@ -47,16 +50,22 @@ public:
     void listJobs();
     // Loads a job with its template, standard, trials and tolerance sets: sgJobLoaded.
     void loadJob(const std::shared_ptr<DirEntry> &entry);
+    // Loads the formulas and recipe trials of the "Formulas" folder with their colorants:
+    // sgFormulasLoaded (the folder's objects first, in its order).
+    void loadFormulas();
 
 Q_SIGNALS:
     void sgOpened();
     void sgJobsListed(std::vector<std::shared_ptr<vexa::DirEntry>> entries);
     void sgJobLoaded(vexa::LoadedJob job);
+    void sgFormulasLoaded(std::vector<std::shared_ptr<vexa::BaseObject>> objects);
     // One line for a message box.
     void sgError(const QString &message);
     void sgBusy(const QString &task, bool busy);
 
 private:
+    // Finds the top-level folder of that name and answers with its id (empty when missing).
+    void findFolder(const QString &name, std::function<void(const QString &)> found);
     void ensureContents();
     void reportError(const QString &operation, const std::shared_ptr<ErrorInfo> &error);
 

@@ -91,6 +91,10 @@ std::shared_ptr<T> make(Random &random)
 const char *const Geometries[] = {Geometry::ANGLE_45asN15, Geometry::ANGLE_45as15, Geometry::ANGLE_45as25,
                                   Geometry::ANGLE_45as45, Geometry::ANGLE_45as75, Geometry::ANGLE_45as110};
 const double Aspecular[] = {-15, 15, 25, 45, 75, 110};
+// The flop-index limits of the automotive sets: ±FlopLimit.
+constexpr double FlopLimit = 0.5;
+// How much the flop of a metallic trial changes with its sparkle deviation.
+constexpr double FlopPerSparkle = 0.05;
 
 // A paint: base reflectance curve (sum of Gaussians and a sigmoid) and how much
 // metallic flop it has.
@@ -108,13 +112,15 @@ struct Paint
 };
 
 // How a trial departs from its standard: lightness factor, hue shift of the
-// spectral features in nm, chroma factor on the coloured part.
+// spectral features in nm, chroma factor on the coloured part; for metallics the
+// change of sparkle and the factor on the flop that the flakes' alignment brings with it.
 struct Deviation
 {
     double lightness = 1.0;
     double hueShiftNm = 0.0;
     double chroma = 1.0;
     double sparkle = 0.0;
+    double flop = 1.0;
 };
 
 double reflectance(const Paint &p, double nm, double aspecular, const Deviation &d)
@@ -126,7 +132,8 @@ double reflectance(const Paint &p, double nm, double aspecular, const Deviation 
     // Towards the illumination (negative aspecular angles) the flakes reflect less than
     // at the same angle past the specular.
     const double away = aspecular < 0 ? 1.8 * -aspecular : aspecular;
-    const double angular = p.flop > 0 ? (1.0 - p.flop) + p.flop * 2.6 * std::exp(-away / 28.0)
+    const double flop = std::clamp(p.flop * d.flop, 0.0, 1.0);
+    const double angular = p.flop > 0 ? (1.0 - flop) + flop * 2.6 * std::exp(-away / 28.0)
                                       : 1.0 - 0.0006 * away;
     const double value = colour * angular * d.lightness;
     return std::clamp(value, 0.002, 1.5);
@@ -254,6 +261,29 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
     // Tolerance sets: pass and check (warning) limits per geometry.
     auto labSet = toleranceSet(random, QStringLiteral("Automotive CIELab"), QStringLiteral("CIELab(+/-)"), 1.0);
     auto de2000Set = toleranceSet(random, QStringLiteral("Automotive CIEDE2000"), QStringLiteral("CIEDE2000"), 1.0);
+    // The automotive ΔE set also judges the flop index (sample-wide, no geometry). Its ids come
+    // from a generator of its own so that everything drawn after it stays as it was.
+    {
+        Random flopRandom(20240602u);
+        auto flop = ToleranceFactory::toleranceFactory()->createTolerance(QStringLiteral("Flop Index(+/-)"), Geometry());
+        if (flop) {
+            const auto renumber = [&flopRandom](BaseObject &object) {
+                object.setId(flopRandom.id());
+                object.setUuid(QUuid::fromString(object.id()));
+            };
+            renumber(*flop);
+            for (const auto &parameter : flop->toleranceParameters())
+                renumber(*parameter);
+            for (const auto &value : flop->toleranceValues()) {
+                renumber(*value);
+                if (value->isEditable())
+                    value->setValue(value->valueAsDouble() * FlopLimit);
+            }
+            auto tolerances = de2000Set->tolerances();
+            tolerances.push_back(flop);
+            de2000Set->setTolerances(tolerances);
+        }
+    }
     auto cmcSet = toleranceSet(random, QStringLiteral("Solid CMC"), QStringLiteral("CMC(l:c)"), 1.0);
     auto de94Set = toleranceSet(random, QStringLiteral("Solid CIE94"), QStringLiteral("CIE94"), 1.2);
     if (!store(objectStore, {labSet, de2000Set, cmcSet, de94Set}, tolerancesFolder->id(), error))
@@ -300,6 +330,8 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
                 d.hueShiftNm = 3.0 * scale * dh / norm;
                 d.chroma = 1.0 + 0.06 * scale * dc / norm;
                 d.sparkle = sparkle * std::min(1.0, scale);
+                // Better aligned flakes sparkle more and travel further in lightness.
+                d.flop = 1.0 + FlopPerSparkle * sparkle * scale;
                 return d;
             };
             // Bisection on the scale; n grows with it over this range.
@@ -381,7 +413,7 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
         }
         f->setIngredients(ingredients);
         f->setTotalQuantity(total);
-        f->setTotalQuantityUnit(QStringLiteral("g"));
+        f->setTotalQuantityUnit(QStringLiteral("Gram"));
         return f;
     };
     auto silver = formula(QStringLiteral("Silver Metallic"), {{0, 62.0}, {1, 24.0}, {2, 12.5}, {5, 1.5}});
@@ -407,6 +439,7 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
                 restriction(ColorantRestrictionType::Constant, 5, -1, 4.0)}},
         {red, {restriction(ColorantRestrictionType::Ratio, 6, 4, 0.13)}},
     };
+    std::vector<std::shared_ptr<RecipeTrial>> firstSteps;
     for (const auto &[f, restrictions] : recipeSpecs) {
         auto recipe = named<RecipeTrial>(random, f->name() + QStringLiteral(" Recipe"));
         recipe->setFormulas({f});
@@ -415,8 +448,42 @@ bool SampleData::populate(ObjectStore &objectStore, ErrorInfo *error)
         recipe->setFormulationSettings(settings);
         recipe->setRecipeType(QStringLiteral("Correction"));
         recipes.push_back(recipe);
+        firstSteps.push_back(recipe);
     }
-    return store(objectStore, recipes, formulasFolder->id(), error);
+    if (!store(objectStore, recipes, formulasFolder->id(), error))
+        return false;
+
+    // One correction of each recipe after its first trial was judged: the colourist's next
+    // formula, referring back to the first trial, under the same restrictions.
+    const std::vector<std::pair<int, double>> corrections[] = {
+        {{0, 61.0}, {1, 25.5}, {2, 12.5}, {5, 1.0}},
+        {{0, 59.0}, {1, 14.0}, {3, 23.5}, {5, 3.5}},
+        {{0, 54.0}, {4, 39.5}, {6, 5.0}, {5, 1.5}},
+    };
+    std::vector<std::shared_ptr<BaseObject>> correctionSteps;
+    for (size_t i = 0; i < firstSteps.size(); ++i) {
+        const auto &first = firstSteps[i];
+        const QString name = first->formula()->name();
+        auto corrected = formula(name + QStringLiteral(" Correction 1"), corrections[i]);
+        auto step = named<RecipeTrial>(random, name + QStringLiteral(" Correction 1"));
+        step->setFormulas({corrected});
+        auto settings = make<FormulationSettings>(random);
+        std::vector<std::shared_ptr<ColorantRestriction>> restrictions;
+        for (const auto &r : first->formulationSettings()->colorantRestrictions()) {
+            auto copy = make<ColorantRestriction>(random);
+            copy->setRestrictionType(r->restrictionType());
+            copy->setColorant(r->colorant());
+            copy->setAnchorColorant(r->anchorColorant());
+            copy->setValue(r->value());
+            restrictions.push_back(copy);
+        }
+        settings->setColorantRestrictions(restrictions);
+        step->setFormulationSettings(settings);
+        step->setPreviousRecipeTrial(first);
+        step->setRecipeType(QStringLiteral("Correction"));
+        correctionSteps.push_back(step);
+    }
+    return store(objectStore, correctionSteps, formulasFolder->id(), error);
 }
 
 } // namespace vexa

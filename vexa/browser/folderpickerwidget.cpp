@@ -29,7 +29,8 @@ FolderPickerWidget::FolderPickerWidget(QWidget *parent)
     m_label->setObjectName(QStringLiteral("folderPickerLabel"));
     m_comboBox->setObjectName(QStringLiteral("folderPickerComboBox"));
     m_comboBox->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
-    m_comboBox->setMinimumContentsLength(16);
+    // Short enough for a narrow dock; a wider picker shows longer paths.
+    m_comboBox->setMinimumContentsLength(8);
     m_browseButton->setObjectName(QStringLiteral("folderPickerBrowseButton"));
     m_browseButton->setText(QStringLiteral("…"));
     m_browseButton->setToolTip(tr("Pick another folder"));

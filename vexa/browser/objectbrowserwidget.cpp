@@ -246,7 +246,8 @@ void ObjectBrowserWidget::initialize(CorvidModel *corvidModel, const std::string
     m_detailView->setColumnWidth(1, 110);
     m_detailView->setDispatcherId(m_model->defaultDispatcherId());
 
-    auto *splitter = new QSplitter(Qt::Horizontal, this);
+    m_splitter = new QSplitter(Qt::Horizontal, this);
+    auto *splitter = m_splitter;
     splitter->addWidget(m_folderView);
     splitter->addWidget(m_detailView);
     splitter->setStretchFactor(0, 2);
@@ -377,6 +378,12 @@ void ObjectBrowserWidget::setFolderPickerSettings(std::shared_ptr<FolderPickerSe
     m_favourites->setVisible(m_favourites->settings() != nullptr);
     connect(this, &ObjectBrowserWidget::sgObjectDeleted, m_favourites, &FolderPickerWidget::onObjectDeleted,
             Qt::UniqueConnection);
+}
+
+void ObjectBrowserWidget::setOrientation(Qt::Orientation orientation)
+{
+    if (m_splitter)
+        m_splitter->setOrientation(orientation);
 }
 
 void ObjectBrowserWidget::setCaption(const QString &caption)

@@ -15,6 +15,7 @@
 class QAction;
 class QComboBox;
 class QLabel;
+class QSplitter;
 class QLineEdit;
 class QProgressBar;
 class QStatusBar;
@@ -100,6 +101,9 @@ public:
     void setFolderPickerSettings(std::shared_ptr<FolderPickerSettings> settings);
     // A caption above the browser (the store's name).
     void setCaption(const QString &caption);
+    // The folder tree beside the detail list (horizontal, the default) or above it (vertical,
+    // for a narrow dock).
+    void setOrientation(Qt::Orientation orientation);
 
     CorvidObjectsClientModel *model() const { return m_model; }
     ObjectBrowserView *folderView() const { return m_folderView; }
@@ -177,6 +181,7 @@ private:
     ObjectBrowserFilterModel *m_detailModel = nullptr;
     ObjectBrowserView *m_folderView = nullptr;
     ObjectBrowserView *m_detailView = nullptr;
+    QSplitter *m_splitter = nullptr;
     QLabel *m_caption = nullptr;
     QComboBox *m_typeBox = nullptr;
     QLineEdit *m_searchEdit = nullptr;

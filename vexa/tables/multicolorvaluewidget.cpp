@@ -28,6 +28,7 @@
 #include <QKeyEvent>
 #include <QMenu>
 #include <QMessageBox>
+#include <QRegularExpression>
 #include <QSortFilterProxyModel>
 #include <QTableView>
 #include <QVBoxLayout>
@@ -84,6 +85,7 @@ MultiColorValueWidget::MultiColorValueWidget(QWidget *parent)
     m_view->horizontalHeader()->setDefaultAlignment(Qt::Alignment(int(Qt::AlignCenter) | int(Qt::TextWordWrap)));
     m_view->setTextElideMode(Qt::ElideMiddle);
     m_view->installEventFilter(this);
+    m_view->viewport()->installEventFilter(this);
     connect(m_view->selectionModel(), &QItemSelectionModel::selectionChanged, this,
             &MultiColorValueWidget::onViewSelectionChanged);
     connect(m_proxy, &QAbstractItemModel::modelReset, this, &MultiColorValueWidget::restoreSelection);
@@ -164,10 +166,61 @@ void MultiColorValueWidget::fitColumns()
         return;
     QHeaderView *header = m_view->horizontalHeader();
     const int columns = m_proxy->columnCount();
+    // Number columns stretch over what the text columns leave. When the table is too narrow for
+    // every text and header, the verdict and number columns keep their headers' widths (a tolerance
+    // set's name is never cut to "itomoti") and the date and instrument give way first; only what
+    // still does not fit scrolls sideways.
+    enum class Kind { Primary, Secondary, Number };
+    QVector<Kind> kinds(columns, Kind::Number);
+    int primary = 0;
+    int secondaryNeed = 0;
+    int secondaryCount = 0;
+    int numbers = 0;
+    const auto *view = static_cast<const QAbstractItemView *>(m_view);
     for (int c = 0; c < columns; ++c) {
         const auto column = m_model->columnAt(c);
-        const bool text = column && (column->alignment() & Qt::AlignLeft);
-        header->setSectionResizeMode(c, text ? QHeaderView::ResizeToContents : QHeaderView::Stretch);
+        if (column && (column->alignment() & Qt::AlignLeft)) {
+            const bool secondary = dynamic_cast<const ColumnDefinitionDateTime *>(column.get())
+                || dynamic_cast<const ColumnDefinitionInstrumentInfo *>(column.get());
+            kinds[c] = secondary ? Kind::Secondary : Kind::Primary;
+        }
+        if (header->isSectionHidden(c))
+            continue;
+        const int contents = std::max(view->sizeHintForColumn(c), header->sectionSizeHint(c));
+        switch (kinds[c]) {
+        case Kind::Primary: primary += contents; break;
+        case Kind::Secondary: secondaryNeed += contents; ++secondaryCount; break;
+        case Kind::Number: numbers += header->sectionSizeHint(c); break;
+        }
+    }
+    const int available = m_view->viewport()->width();
+    const bool fits = primary + secondaryNeed + numbers <= available;
+    // Narrow, a number column needs only its header's longest word: the header wraps the rest.
+    auto narrowWidth = [this, header](int c) {
+        const QFontMetrics metrics(m_proxy->headerData(c, Qt::Horizontal, Qt::FontRole).value<QFont>());
+        int widest = 0;
+        for (const QString &word : m_proxy->headerData(c, Qt::Horizontal).toString().split(QRegularExpression(QStringLiteral("\\s+")), Qt::SkipEmptyParts))
+            widest = std::max(widest, metrics.horizontalAdvance(word));
+        return std::min(header->sectionSizeHint(c), widest + 12);
+    };
+    if (!fits) {
+        numbers = 0;
+        for (int c = 0; c < columns; ++c) {
+            if (kinds[c] == Kind::Number && !header->isSectionHidden(c))
+                numbers += narrowWidth(c);
+        }
+    }
+    const int secondaryWidth =
+        secondaryCount > 0 ? std::max(60, (available - primary - numbers) / secondaryCount) : 0;
+    for (int c = 0; c < columns; ++c) {
+        if (kinds[c] == Kind::Primary || (fits && kinds[c] == Kind::Secondary)) {
+            header->setSectionResizeMode(c, QHeaderView::ResizeToContents);
+        } else if (fits) {
+            header->setSectionResizeMode(c, QHeaderView::Stretch);
+        } else {
+            header->setSectionResizeMode(c, QHeaderView::Interactive);
+            header->resizeSection(c, kinds[c] == Kind::Secondary ? secondaryWidth : narrowWidth(c));
+        }
     }
 }
 
@@ -229,6 +282,8 @@ bool MultiColorValueWidget::eventFilter(QObject *watched, QEvent *event)
         keyPressEvent(static_cast<QKeyEvent *>(event));
         return true;
     }
+    if (watched == m_view->viewport() && event->type() == QEvent::Resize)
+        fitColumns();
     return QWidget::eventFilter(watched, event);
 }
 

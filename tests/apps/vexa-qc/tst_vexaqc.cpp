@@ -1,7 +1,10 @@
 #include "comparisonpage.h"
 #include "mainwindow.h"
+#include "recipepage.h"
 #include "spectralpage.h"
 
+#include <vexa/formula/formulatablemodel.h>
+#include <vexa/formula/formulawidget.h>
 #include <vexa/graph/metamerismview.h>
 #include <vexa/graph/spectralplotwidget.h>
 #include <vexa/graph/spectralvaluetablemodel.h>
@@ -13,10 +16,15 @@
 #include <vexa/plots/plotwidget.h>
 #include <vexa/plots/trialgraphicsitem.h>
 #include <vexa/tables/appearanceviewtablemodelrow.h>
+#include <vexa/tables/floptablemodel.h>
+#include <vexa/tables/floptablewidget.h>
 #include <vexa/tables/multicolorvaluetablemodel.h>
 #include <vexa/tables/multicolorvaluewidget.h>
 
+#include <domain/colorant.h>
 #include <domain/domainmetatypes.h>
+#include <domain/formula.h>
+#include <domain/recipetrial.h>
 #include <domain/qcjob.h>
 #include <domain/standard.h>
 #include <domain/tolerance.h>
@@ -57,6 +65,8 @@ private Q_SLOTS:
     void tableAndPlotFollowTheTrialList();
     void tableAndPlotFollowTheGeometryFilter();
     void spectralPageFollowsTheSelection();
+    void flopTableFollowsTheSelection();
+    void recipePageShowsTheStoresFormulas();
     void anotherJobReplacesThePage();
     void toleranceSetThatCannotJudgeSaysWhy();
     void batchJudgeWritesTheWorkbook();
@@ -145,6 +155,55 @@ void tst_VexaQc::tableAndPlotFollowTheTrialList()
     QCOMPARE(page->tableWidget()->tableModel()->rowCount(), before - 6);
 }
 
+// The flop table beside the colour table lists the standard and every trial, judges the
+// flop with the automotive ΔE set's flop tolerance while the page shows the CIELab set, and
+// selects the row of the trial selected in the list.
+void tst_VexaQc::flopTableFollowsTheSelection()
+{
+    ComparisonPage *page = m_window->page();
+    FlopTableWidget *flop = page->flopWidget();
+    QVERIFY(flop);
+    const auto trials = page->dataModel()->trials();
+    QCOMPARE(flop->tableModel()->rowCount(), 1 + int(trials.size()));
+    QVERIFY(flop->tableModel()->flopTolerance());
+    QVERIFY(flop->tableModel()->index(1, FlopTableModel::FlopDifferenceColumn).data(Qt::BackgroundRole).isValid());
+    page->trialList()->setCurrentRow(6);
+    const QModelIndexList selected = flop->tableView()->selectionModel()->selectedRows();
+    QCOMPARE(selected.size(), 1);
+    QCOMPARE(selected.first().row(), 7);
+    QCOMPARE(flop->tableModel()->trialAt(7), trials[6]);
+}
+
+// The "Recipe" page lists the three recipes (first trial and correction) and the three
+// formulas of the sample store, with their colorants loaded: amounts in any unit.
+void tst_VexaQc::recipePageShowsTheStoresFormulas()
+{
+    RecipePage *recipes = m_window->recipePage();
+    QTRY_COMPARE(recipes->recipeList()->count(), 6);
+    QCOMPARE(recipes->recipeList()->item(0)->text(), QStringLiteral("Silver Metallic Recipe"));
+    QCOMPARE(recipes->recipeList()->item(3)->text(), QStringLiteral("Silver Metallic"));
+    QCOMPARE(recipes->recipes().front().size(), size_t(2));
+    QVERIFY(m_window->showPage("recipe"));
+    QVERIFY(!m_window->showPage("nonsense"));
+
+    FormulaWidget *widget = recipes->formulaWidget();
+    FormulaTableModel *model = widget->tableModel();
+    QCOMPARE(model->recipeTrial()->name(), QStringLiteral("Silver Metallic Correction 1"));
+    QCOMPARE(model->rowCount(), 4);
+    widget->setUnit(FormulaUnits::FluidOunce);
+    const int amount = model->columnOfKind(FormulaTableModel::ColumnKind::Amount);
+    QCOMPARE(model->headerData(amount, Qt::Horizontal).toString(), QStringLiteral("Amount (fl oz)"));
+    QCOMPARE(model->colorantAt(0)->name(), QStringLiteral("Clear Binder"));
+    // 61 g of Clear Binder (1.02 g/ml) in fluid ounces.
+    QVERIFY(std::fabs(model->valueAt(0, FormulaTableModel::ColumnKind::Amount) - 61.0 / 1.02 / 29.5735) < 1e-9);
+    QVERIFY(model->problems().isEmpty());
+
+    recipes->recipeList()->setCurrentRow(5);
+    QCOMPARE(model->formula()->name(), QStringLiteral("Red Solid"));
+    widget->setUnit(FormulaUnits::Gram);
+    QVERIFY(m_window->showPage("comparison"));
+}
+
 void tst_VexaQc::tableAndPlotFollowTheGeometryFilter()
 {
     ComparisonPage *page = m_window->page();
@@ -170,7 +229,10 @@ void tst_VexaQc::tableAndPlotFollowTheGeometryFilter()
 void tst_VexaQc::spectralPageFollowsTheSelection()
 {
     ComparisonPage *page = m_window->page();
-    QVERIFY(page->showViews("spectra"));
+    QVERIFY(m_window->showPage("recipe"));
+    // "spectra" brings the comparison page with its Spectra tab; "comparison" its colour views.
+    QVERIFY(m_window->showPage("spectra"));
+    QCOMPARE(m_window->pages()->currentWidget(), page);
     QCOMPARE(page->viewTabs()->currentWidget(), page->spectralPage());
     QVERIFY(!page->showViews("nonsense"));
     SpectralPage *spectral = page->spectralPage();
@@ -204,7 +266,8 @@ void tst_VexaQc::spectralPageFollowsTheSelection()
     QCOMPARE(spectral->tableModel()->columnCount(), 1 + 6 * 3);
     QVERIFY(spectral->tableText().startsWith(QStringLiteral("nm\t")));
     spectral->scopeBox()->setCurrentIndex(0);
-    QVERIFY(page->showViews("colour"));
+    QVERIFY(m_window->showPage("comparison"));
+    QCOMPARE(page->viewTabs()->currentIndex(), 0);
 }
 
 void tst_VexaQc::toleranceSetThatCannotJudgeSaysWhy()

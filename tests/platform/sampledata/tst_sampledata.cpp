@@ -92,7 +92,7 @@ void tst_SampleData::counts_data()
     QTest::newRow("tolerance sets") << "ToleranceSet" << 4;
     QTest::newRow("colorants") << "Colorant" << 7;
     QTest::newRow("formulas") << "Formula" << 3;
-    QTest::newRow("recipe trials") << "RecipeTrial" << 3;
+    QTest::newRow("recipe trials") << "RecipeTrial" << 6; // a first trial and one correction per formula
 }
 
 void tst_SampleData::counts()

@@ -24,6 +24,8 @@
 #include <QMenu>
 #include <QMessageBox>
 #include <QPrintDialog>
+#include <QRegularExpression>
+#include <QScrollBar>
 #include <QPrinter>
 #include <QSettings>
 #include <QSignalSpy>
@@ -100,6 +102,8 @@ private Q_SLOTS:
     void shouldSetUpTheView()
     {
         Fixture f;
+        f.widget.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&f.widget));
         QCOMPARE(f.view()->selectionBehavior(), QAbstractItemView::SelectRows);
         QVERIFY(qobject_cast<DrawBorderDelegate *>(f.view()->itemDelegate()));
         // Text columns fit their contents; the number columns share the rest of the width.
@@ -526,6 +530,33 @@ private Q_SLOTS:
         }
         // The number columns still share the rest.
         QVERIFY(header->sectionSize(3) > 40);
+    }
+
+    // Too narrow for every header: the number columns keep room for their headers' longest word
+    // (the header wraps the rest) and the table scrolls sideways rather than cutting a tolerance
+    // set's name; wide again, they stretch.
+    void numberColumnsKeepTheirHeadersWhenNarrow()
+    {
+        Fixture f;
+        f.page.toleranceSet->setName(QStringLiteral("Automotive CIEDE2000 supplier B"));
+        f.page.data->setStandard(f.page.standard); // same standard: nothing changes
+        f.widget.settingsChanged();
+        f.widget.resize(420, 300);
+        f.widget.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&f.widget));
+        QHeaderView *header = f.view()->horizontalHeader();
+        for (int c = 3; c < f.proxy()->columnCount(); ++c) {
+            const QFontMetrics metrics(f.proxy()->headerData(c, Qt::Horizontal, Qt::FontRole).value<QFont>());
+            int widest = 0;
+            for (const QString &word : f.proxy()->headerData(c, Qt::Horizontal).toString().split(QRegularExpression("\\s+")))
+                widest = std::max(widest, metrics.horizontalAdvance(word));
+            QVERIFY2(header->sectionSize(c) >= widest,
+                     qPrintable(QStringLiteral("column %1: %2 < %3").arg(c).arg(header->sectionSize(c)).arg(widest)));
+        }
+        QVERIFY(f.view()->horizontalScrollBar()->maximum() > 0);
+        f.widget.resize(1600, 300);
+        QTRY_COMPARE(header->sectionResizeMode(3), QHeaderView::Stretch);
+        QCOMPARE(f.view()->horizontalScrollBar()->maximum(), 0);
     }
 
     void uninitializedWidgetShouldNotCrash()
