@@ -140,7 +140,8 @@ int main(int argc, char **argv)
             std::fprintf(stderr, "vexa-qc: %s\n", qPrintable(text));
             exitCode = 2;
         });
-        window.resize(1500, 940);
+        // A full-HD desktop, the size a QC workstation's page is laid out for.
+        window.resize(1920, 1080);
         // The page is ready when its data is shown: the job, or the formulas.
         auto done = std::make_shared<bool>(false);
         const auto grab = [&window, file, done] {

@@ -23,6 +23,8 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QFileDialog>
+#include <QGuiApplication>
+#include <QScreen>
 #include <QTimer>
 #include <QFileInfo>
 #include <QLabel>
@@ -32,6 +34,8 @@
 #include <QStatusBar>
 #include <QTabWidget>
 #include <QToolBar>
+
+#include <algorithm>
 
 namespace vexa {
 
@@ -84,7 +88,10 @@ MainWindow::MainWindow(std::shared_ptr<GeneralSettings> generalSettings,
     connect(m_session, &StoreSession::sgError, this, &MainWindow::showError);
     connect(m_session, &StoreSession::sgBusy, this, &MainWindow::setBusy);
     connect(m_jobBox, QOverload<int>::of(&QComboBox::activated), this, &MainWindow::onJobChosen);
-    resize(1400, 900);
+    // Most of the screen: the page shows a table, a flop table and two plots side by side.
+    const QScreen *screen = QGuiApplication::primaryScreen();
+    const QSize available = screen ? screen->availableGeometry().size() : QSize(1400, 900);
+    resize(std::max(1400, available.width() * 9 / 10), std::max(900, available.height() * 9 / 10));
 }
 
 MainWindow::~MainWindow() = default;
